@@ -1,0 +1,41 @@
+# How the project's own targets are compiled, in one place.
+
+set(ZON_WARNINGS -Wall -Wextra -Wpedantic -Wconversion -Wsign-conversion -Wshadow -Wold-style-cast)
+if(ZON_WARNINGS_AS_ERRORS)
+	list(APPEND ZON_WARNINGS -Werror)
+endif()
+
+# Floating-point results are compared bit for bit: a contracted multiply-add rounds once where the formulas round twice.
+set(ZON_CODE_OPTIONS -ffp-contract=off)
+
+# Options that every target of the project shares, libraries and programs alike.
+function(zon_target_defaults inTarget)
+	target_compile_features(${inTarget} PUBLIC cxx_std_20)
+	target_compile_options(${inTarget} PRIVATE ${ZON_WARNINGS} ${ZON_CODE_OPTIONS})
+	set_target_properties(${inTarget} PROPERTIES
+		CXX_EXTENSIONS OFF
+		CXX_VISIBILITY_PRESET hidden
+		VISIBILITY_INLINES_HIDDEN ON)
+endfunction()
+
+# A library of the project: its sources are all of its src/ folder, its headers are found from the repository root.
+# inMacro is the prefix of its export macro (see Export.h of the library).
+function(zon_add_library inTarget inMacro)
+	file(GLOB sources CONFIGURE_DEPENDS "${CMAKE_CURRENT_SOURCE_DIR}/src/*.cpp")
+	add_library(${inTarget} ${sources})
+	add_library(${inTarget}::${inTarget} ALIAS ${inTarget})
+	zon_target_defaults(${inTarget})
+	target_include_directories(${inTarget} PUBLIC
+		"$<BUILD_INTERFACE:${zonmediatypes_SOURCE_DIR}>"
+		"$<BUILD_INTERFACE:${zonmediatypes_BINARY_DIR}/include>"
+		"$<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>")
+	target_compile_definitions(${inTarget} PRIVATE ${inMacro}_BUILDING)
+	get_target_property(type ${inTarget} TYPE)
+	if(type STREQUAL "STATIC_LIBRARY")
+		target_compile_definitions(${inTarget} PUBLIC ${inMacro}_STATIC)
+	endif()
+	set_target_properties(${inTarget} PROPERTIES
+		VERSION ${zonmediatypes_VERSION}
+		SOVERSION ${zonmediatypes_VERSION_MAJOR}
+		POSITION_INDEPENDENT_CODE ON)
+endfunction()

@@ -1,0 +1,70 @@
+#pragma once
+
+/// \file
+/// Display text by key. A key is a path, "=" and the English text, as in
+/// "$$$/zonmediatypes/RenderQuality/Draft=Draft"; the host may install a translator that knows texts for keys.
+
+#include "zoncore/Export.h"
+#include "zoncore/UTF16String.h"
+
+#include <functional>
+#include <initializer_list>
+#include <span>
+#include <string_view>
+
+namespace zoncore::config
+{
+
+/// Receives the whole key, "=" and English text included. True: outText is the translation. False, or an exception: the
+/// key has none, and what was written to outText is discarded. It is called with no lock held, from any thread.
+using Translator = std::function<bool(std::string_view inKey, UTF16String& outText)>;
+
+/// The process-wide source of display text.
+class ZONCORE_API Localizer
+{
+public:
+	static Localizer& Get() noexcept;
+
+	/// The translation of inKey, or the English text behind its first "=" (UTF-8) when there is none; a key without "="
+	/// has an empty one. Costs one atomic load and the text when no translator is installed. Safe on any thread.
+	UTF16String Lookup(std::string_view inKey) const;
+
+	/// Installs inTranslator; an empty one removes it. Safe while other threads look up: a look-up that has begun ends
+	/// with the translator it began with.
+	void SetTranslator(Translator inTranslator);
+
+private:
+	Localizer() = default;
+};
+
+}   // namespace zoncore::config
+
+namespace zoncore
+{
+
+/// Fills "@0" ... "@9" of inTemplate with inReplacements, in one pass: text that was filled in is not searched again. A
+/// placeholder without replacement stays as it is.
+ZONCORE_API UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements);
+
+/// The localised text of a key with its placeholders filled; see FillPlaceholders.
+class ZString
+{
+public:
+	explicit ZString(std::string_view inKey) : mText(config::Localizer::Get().Lookup(inKey)) {}
+	ZString(std::string_view inKey, std::initializer_list<UTF16String> inReplacements)
+		: ZString(inKey, std::span(inReplacements.begin(), inReplacements.size()))
+	{
+	}
+	ZString(std::string_view inKey, std::span<const UTF16String> inReplacements)
+		: mText(FillPlaceholders(config::Localizer::Get().Lookup(inKey), inReplacements))
+	{
+	}
+
+	operator UTF16String() const& { return mText; }             // NOLINT(google-explicit-constructor): it is that text
+	operator UTF16String() && { return std::move(mText); }      // NOLINT(google-explicit-constructor)
+
+private:
+	UTF16String mText;
+};
+
+}   // namespace zoncore

@@ -1,0 +1,61 @@
+#pragma once
+
+/// \file
+/// Conversions between numbers, and between numbers and text. None depends on a locale.
+
+#include "zoncore/Export.h"
+#include "zoncore/Flags.h"
+#include "zoncore/UTF16String.h"
+
+#include <boost/rational.hpp>
+#include <concepts>
+#include <cstdint>
+#include <limits>
+
+namespace zoncore::utility
+{
+
+/// inValue truncated toward zero; the most negative value of Integer for NaN and for everything that does not fit, the
+/// infinities included.
+template <class Integer>
+	requires std::same_as<Integer, std::int64_t> || std::same_as<Integer, std::int32_t>
+constexpr Integer TruncateTo(double inValue) noexcept
+{
+	constexpr double kTooLarge = -static_cast<double>(std::numeric_limits<Integer>::min());   // 2^63 or 2^31
+	constexpr double kTooSmall = sizeof(Integer) == 8 ? -kTooLarge * (1 + 0x1p-52) : -kTooLarge - 1;
+	return inValue > kTooSmall && inValue < kTooLarge ? static_cast<Integer>(inValue)
+													  : std::numeric_limits<Integer>::min();
+}
+
+/// Drops the trailing zeros of a fraction, and then a bare point.
+inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
+
+/// inValue in fixed notation, correctly rounded to inDecimals places (exact halves to even): "1.0", "29.97", "0.9091".
+/// The integer part is padded with zeros to inMinIntegerDigits (0 acts as 1). A negative value that rounds to zero has no
+/// sign. Text of more than inMaxLength characters, sign included, is written as printf's "%g" writes it instead
+/// ("1.79769e+308"). Infinities are "inf" and "-inf", NaN is "nan".
+ZONCORE_API UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, unsigned long inDecimals,
+	Flags<unsigned short> inFlags, int inMaxLength);
+
+/// Reads the longest number at the start of inText: ASCII white space, an optional sign, decimal digits; for a double
+/// also "." with more digits and an exponent that has digits. What follows is ignored. False, and 0, when there are no
+/// digits or when an integer is out of range; a double out of range is the infinity of its sign, or zero, with true.
+/// inOptions is accepted and changes nothing.
+ZONCORE_API bool StringToNumber(UTF16StringView inText, int& outValue, unsigned inOptions);
+ZONCORE_API bool StringToNumber(UTF16StringView inText, long long& outValue, unsigned inOptions);
+ZONCORE_API bool StringToNumber(UTF16StringView inText, double& outValue, unsigned inOptions);
+
+template <class Number>
+bool StringToNumber(const UTF16String& inText, Number& outValue, unsigned inOptions)
+{
+	return StringToNumber(UTF16StringView(inText), outValue, inOptions);
+}
+
+/// The fraction closest to inValue with both terms in -2147483646..2147483646; of two equally close ones that with the
+/// smaller denominator, then the one nearer to zero. NaN gives 0/1; a larger magnitude gives plus or minus 2147483646/1.
+///
+/// Compare a boost::rational with a boost::rational only: with a bare integer the comparison never returns in C++20 with
+/// the supported compilers and Boost.
+ZONCORE_API boost::rational<int> RationalApproximation(double inValue);
+
+}   // namespace zoncore::utility

@@ -1,0 +1,139 @@
+#include "zoncore/UTF16String.h"
+
+#include <algorithm>
+#include <array>
+
+using zoncore::UTF16Char;
+
+// The facets classify and convert as the classic locale's own facet does for `char`, for the characters of ASCII.
+namespace
+{
+
+constexpr UTF16Char kLastAsciiChar = 0x7F;
+
+const std::ctype<char>& AsciiFacet()
+{
+	return std::use_facet<std::ctype<char>>(std::locale::classic());
+}
+
+bool IsAscii(UTF16Char inChar)
+{
+	return inChar <= kLastAsciiChar;
+}
+
+std::ctype_base::mask Classify(UTF16Char inChar)
+{
+	return IsAscii(inChar) ? AsciiFacet().table()[inChar] : std::ctype_base::mask{};
+}
+
+}   // namespace
+
+std::locale::id std::ctype<UTF16Char>::id;
+
+bool std::ctype<UTF16Char>::do_is(mask inMask, char_type inChar) const
+{
+	return (Classify(inChar) & inMask) != 0;
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_is(const char_type* inBegin, const char_type* inEnd, mask* outMasks) const
+{
+	std::transform(inBegin, inEnd, outMasks, Classify);
+	return inEnd;
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_scan_is(mask inMask, const char_type* inBegin, const char_type* inEnd) const
+{
+	return std::find_if(inBegin, inEnd, [&](char_type inChar) { return do_is(inMask, inChar); });
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_scan_not(mask inMask, const char_type* inBegin, const char_type* inEnd) const
+{
+	return std::find_if_not(inBegin, inEnd, [&](char_type inChar) { return do_is(inMask, inChar); });
+}
+
+UTF16Char std::ctype<UTF16Char>::do_toupper(char_type inChar) const
+{
+	return IsAscii(inChar) ? do_widen(AsciiFacet().toupper(static_cast<char>(inChar))) : inChar;
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_toupper(char_type* ioBegin, const char_type* inEnd) const
+{
+	for (; ioBegin != inEnd; ++ioBegin)
+		*ioBegin = do_toupper(*ioBegin);
+	return inEnd;
+}
+
+UTF16Char std::ctype<UTF16Char>::do_tolower(char_type inChar) const
+{
+	return IsAscii(inChar) ? do_widen(AsciiFacet().tolower(static_cast<char>(inChar))) : inChar;
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_tolower(char_type* ioBegin, const char_type* inEnd) const
+{
+	for (; ioBegin != inEnd; ++ioBegin)
+		*ioBegin = do_tolower(*ioBegin);
+	return inEnd;
+}
+
+UTF16Char std::ctype<UTF16Char>::do_widen(char inChar) const
+{
+	return static_cast<unsigned char>(inChar);
+}
+
+const char* std::ctype<UTF16Char>::do_widen(const char* inBegin, const char* inEnd, char_type* outChars) const
+{
+	std::transform(inBegin, inEnd, outChars, [&](char inChar) { return do_widen(inChar); });
+	return inEnd;
+}
+
+char std::ctype<UTF16Char>::do_narrow(char_type inChar, char inDefault) const
+{
+	return IsAscii(inChar) ? static_cast<char>(inChar) : inDefault;
+}
+
+const UTF16Char* std::ctype<UTF16Char>::do_narrow(
+	const char_type* inBegin, const char_type* inEnd, char inDefault, char* outChars) const
+{
+	std::transform(inBegin, inEnd, outChars, [&](char_type inChar) { return do_narrow(inChar, inDefault); });
+	return inEnd;
+}
+
+std::locale::id std::numpunct<UTF16Char>::id;
+
+UTF16Char std::numpunct<UTF16Char>::do_decimal_point() const
+{
+	return '.';
+}
+
+UTF16Char std::numpunct<UTF16Char>::do_thousands_sep() const
+{
+	return ',';
+}
+
+std::string std::numpunct<UTF16Char>::do_grouping() const
+{
+	return {};
+}
+
+std::basic_string<UTF16Char> std::numpunct<UTF16Char>::do_truename() const
+{
+	return {'t', 'r', 'u', 'e'};
+}
+
+std::basic_string<UTF16Char> std::numpunct<UTF16Char>::do_falsename() const
+{
+	return {'f', 'a', 'l', 's', 'e'};
+}
+
+template class std::num_get<UTF16Char>;
+template class std::num_put<UTF16Char>;
+
+const std::locale& zoncore::ClassicUTF16Locale()
+{
+	// Never destroyed: streams may still be made while other static objects are.
+	static const std::locale& sLocale = *new std::locale(
+		std::locale(std::locale(std::locale(std::locale::classic(), new std::ctype<UTF16Char>), new std::numpunct<UTF16Char>),
+			new std::num_put<UTF16Char>),
+		new std::num_get<UTF16Char>);
+	return sLocale;
+}

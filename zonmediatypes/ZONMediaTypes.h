@@ -1,0 +1,19 @@
+#pragma once
+
+/// \file
+/// The whole library in one header, and the entry points that a client calls around its use of it.
+
+#include "zonmediatypes/Export.h"
+#include "zonmediatypes/Version.h"
+
+namespace zonmediatypes
+{
+
+/// Counts one more client. The count is kept for hosts that pair the calls; every function of the library works without
+/// it. Safe on any thread.
+ZONMEDIATYPES_API void Initialize();
+
+/// Counts one client less. A call without its Initialize() is not detected: the count goes below zero.
+ZONMEDIATYPES_API void Terminate();
+
+}   // namespace zonmediatypes
