@@ -44,7 +44,7 @@ consteval std::array<std::string_view, (inCounts + ... + 0)> JoinKeys(
 	const std::array<std::string_view, inCounts>&... inKeys)
 {
 	std::array<std::string_view, (inCounts + ... + 0)> joined;
-	auto end = joined.begin();
+	[[maybe_unused]] auto end = joined.begin();
 	((end = std::ranges::copy(inKeys, end).out), ...);
 	return joined;
 }
