@@ -20,8 +20,14 @@ public:
 	constexpr bool Test(Flags inFlags) const noexcept { return (mBits & inFlags.mBits) == inFlags.mBits; }
 	constexpr T GetBits() const noexcept { return mBits; }
 
-	friend constexpr Flags operator|(Flags inLHS, Flags inRHS) noexcept { return static_cast<T>(inLHS.mBits | inRHS.mBits); }
-	friend constexpr Flags operator&(Flags inLHS, Flags inRHS) noexcept { return static_cast<T>(inLHS.mBits & inRHS.mBits); }
+	friend constexpr Flags operator|(Flags inLHS, Flags inRHS) noexcept
+	{
+		return static_cast<T>(inLHS.mBits | inRHS.mBits);
+	}
+	friend constexpr Flags operator&(Flags inLHS, Flags inRHS) noexcept
+	{
+		return static_cast<T>(inLHS.mBits & inRHS.mBits);
+	}
 	friend constexpr bool operator==(Flags inLHS, Flags inRHS) noexcept = default;
 
 private:

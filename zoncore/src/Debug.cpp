@@ -61,9 +61,8 @@ bool BreakAfterAssertDialog(std::atomic<bool>& ioDisabled, const char* inConditi
 		return false;
 	std::atomic<bool> ignored = false;
 	const auto dialog = sAssertDialog.Get();
-	return dialog
-		? (*dialog)(inMayDisable ? ioDisabled : ignored, inCondition, inMessage, inFile, inLine, inFunction)
-		: PrintAssert(inCondition, inMessage, inFile, inLine, inFunction);
+	return dialog ? (*dialog)(inMayDisable ? ioDisabled : ignored, inCondition, inMessage, inFile, inLine, inFunction)
+				  : PrintAssert(inCondition, inMessage, inFile, inLine, inFunction);
 }
 
 bool IsDebuggerAttached() noexcept
@@ -80,7 +79,8 @@ bool IsDebuggerAttached() noexcept
 	const std::string_view status(buffer, static_cast<std::size_t>(size));
 	constexpr std::string_view kTracer = "TracerPid:\t";
 	const auto found = status.find(kTracer);
-	return found != std::string_view::npos && found + kTracer.size() < status.size() && status[found + kTracer.size()] != '0';
+	return found != std::string_view::npos && found + kTracer.size() < status.size()
+		&& status[found + kTracer.size()] != '0';
 }
 
 void Break() noexcept

@@ -54,8 +54,8 @@ UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16St
 	UTF16String text;
 	for (std::size_t i = 0; i < inTemplate.size(); ++i)
 	{
-		const bool isMark = inTemplate[i] == '@' && i + 1 < inTemplate.size() && inTemplate[i + 1] >= '0'
-			&& inTemplate[i + 1] <= '9';
+		const bool isMark
+			= inTemplate[i] == '@' && i + 1 < inTemplate.size() && inTemplate[i + 1] >= '0' && inTemplate[i + 1] <= '9';
 		const auto index = isMark ? static_cast<std::size_t>(inTemplate[i + 1] - '0') : inReplacements.size();
 		if (index < inReplacements.size())
 		{

@@ -19,9 +19,9 @@ namespace
 
 // ---- Numbers to text -------------------------------------------------------------------------------------------------
 
-constexpr std::size_t kMostIntegerDigits = 309;    // of a finite double
-constexpr std::size_t kMostDecimals = 1074;        // beyond these every double has zeros only
-constexpr int kGeneralDigits = 6;                  // the precision of "%g"
+constexpr std::size_t kMostIntegerDigits = 309;   // of a finite double
+constexpr std::size_t kMostDecimals = 1074;       // beyond these every double has zeros only
+constexpr int kGeneralDigits = 6;                 // the precision of "%g"
 
 std::string GeneralText(double inValue)
 {

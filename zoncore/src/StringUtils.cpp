@@ -33,6 +33,7 @@ struct LeadByte
 	unsigned char mPayloadMask;
 };
 
+// clang-format off
 constexpr LeadByte ReadLeadByte(unsigned char inByte)
 {
 	if (inByte < 0xC2)   return {0, 0, 0, 0};
@@ -45,6 +46,7 @@ constexpr LeadByte ReadLeadByte(unsigned char inByte)
 	if (inByte == 0xF4)  return {3, 0x80, 0x8F, 0x07};
 	return {0, 0, 0, 0};
 }
+// clang-format on
 
 // The first code point of inText, which is not empty; U+FFFD for a maximal subpart that is ill-formed.
 Decoded DecodeUTF8(std::string_view inText)
@@ -74,8 +76,10 @@ Decoded DecodeUTF8(std::string_view inText)
 Decoded DecodeUTF16(UTF16StringView inText)
 {
 	const char32_t first = inText.front();
-	if ((first & kSurrogateMask) == kHighSurrogate && inText.size() > 1 && (inText[1] & kSurrogateMask) == kLowSurrogate)
-		return {kFirstSupplementary + ((first & kSurrogatePayload) << kSurrogateBits | (inText[1] & kSurrogatePayload)), 2};
+	if ((first & kSurrogateMask) == kHighSurrogate && inText.size() > 1
+		&& (inText[1] & kSurrogateMask) == kLowSurrogate)
+		return {
+			kFirstSupplementary + ((first & kSurrogatePayload) << kSurrogateBits | (inText[1] & kSurrogatePayload)), 2};
 	const bool isSurrogate = (first & kSurrogateMask) == kHighSurrogate || (first & kSurrogateMask) == kLowSurrogate;
 	return {isSurrogate ? kReplacementCharacter : first, 1};
 }
@@ -94,8 +98,8 @@ void AppendUTF16(UTF16String& ioText, char32_t inCodePoint)
 
 void AppendUTF8(std::string& ioText, char32_t inCodePoint)
 {
-	const auto continuation = [&](unsigned inShift)
-	{ ioText.push_back(static_cast<char>(0x80 | (inCodePoint >> inShift & 0x3F))); };
+	const auto continuation
+		= [&](unsigned inShift) { ioText.push_back(static_cast<char>(0x80 | (inCodePoint >> inShift & 0x3F))); };
 	if (inCodePoint < 0x80)
 	{
 		ioText.push_back(static_cast<char>(inCodePoint));

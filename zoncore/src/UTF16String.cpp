@@ -132,7 +132,8 @@ const std::locale& zoncore::ClassicUTF16Locale()
 {
 	// Never destroyed: streams may still be made while other static objects are.
 	static const std::locale& sLocale = *new std::locale(
-		std::locale(std::locale(std::locale(std::locale::classic(), new std::ctype<UTF16Char>), new std::numpunct<UTF16Char>),
+		std::locale(
+			std::locale(std::locale(std::locale::classic(), new std::ctype<UTF16Char>), new std::numpunct<UTF16Char>),
 			new std::num_put<UTF16Char>),
 		new std::num_get<UTF16Char>);
 	return sLocale;
