@@ -1,10 +1,13 @@
 #include "zoncore/Localizer.h"
 
+#include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/src/Hook.h"
 #include "zoncore/src/TextKey.h"
 
 #include <cstddef>
+#include <memory>
+#include <mutex>
 #include <utility>
 
 namespace zoncore
@@ -12,17 +15,35 @@ namespace zoncore
 namespace
 {
 
-constinit Hook<bool(std::string_view, UTF16String&)> sTranslator;
+// Where texts come from besides the keys themselves.
+struct Sources
+{
+	config::Translator mTranslator;
+	std::shared_ptr<const config::MessageCatalogue> mCatalogue;
+};
+
+constinit Replaceable<Sources> sSources;
+constinit std::mutex sChangeMutex;   // one change at a time; look-ups do not take it
+
+// Replaces the sources by a copy that inChange has changed.
+template <class Change>
+void ChangeSources(Change inChange)
+{
+	std::shared_ptr<const Sources> before;   // given up after the lock: what it holds is the host's
+	const std::lock_guard lock(sChangeMutex);
+	before = sSources.Get();
+	Sources next = before ? *before : Sources();
+	inChange(next);
+	const bool isEmpty = !next.mTranslator && !next.mCatalogue;
+	sSources.Exchange(isEmpty ? nullptr : std::make_shared<const Sources>(std::move(next)));
+}
 
 // Whether the host's translator gave a text for inKey.
-bool Translate(std::string_view inKey, UTF16String& outText)
+bool Translate(const config::Translator& inTranslator, std::string_view inKey, UTF16String& outText)
 {
-	const auto translator = sTranslator.Get();
-	if (!translator)
-		return false;
 	try
 	{
-		return (*translator)(inKey, outText);
+		return inTranslator && inTranslator(inKey, outText);
 	}
 	catch (...)
 	{
@@ -40,13 +61,23 @@ config::Localizer& config::Localizer::Get() noexcept
 
 UTF16String config::Localizer::Lookup(std::string_view inKey) const
 {
-	UTF16String text;
-	return Translate(inKey, text) ? text : utility::UTF8to16(EnglishText(inKey));
+	const auto sources = sSources.Get();
+	if (!sources)
+		return utility::UTF8to16(EnglishText(inKey));
+	if (UTF16String text; Translate(sources->mTranslator, inKey, text))
+		return text;
+	const std::string_view translation = sources->mCatalogue ? sources->mCatalogue->Find(inKey) : std::string_view();
+	return utility::UTF8to16(translation.empty() ? EnglishText(inKey) : translation);
 }
 
 void config::Localizer::SetTranslator(Translator inTranslator)
 {
-	sTranslator.Exchange(std::move(inTranslator));
+	ChangeSources([&](Sources& ioSources) { ioSources.mTranslator = std::move(inTranslator); });
+}
+
+void config::Localizer::SetCatalogue(std::shared_ptr<const MessageCatalogue> inCatalogue)
+{
+	ChangeSources([&](Sources& ioSources) { ioSources.mCatalogue = std::move(inCatalogue); });
 }
 
 UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements)

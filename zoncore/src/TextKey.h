@@ -5,6 +5,12 @@
 namespace zoncore::config
 {
 
+/// A key up to its first "="; all of it when it has none.
+constexpr std::string_view KeyPath(std::string_view inKey)
+{
+	return inKey.substr(0, inKey.find('='));
+}
+
 /// The text that a key carries behind its first "="; empty when it has none.
 constexpr std::string_view EnglishText(std::string_view inKey)
 {
