@@ -33,7 +33,7 @@ zoncore::UTF16String Describe(std::span<const KeyFor<Value>> inTable, std::type_
 template <class Value, std::size_t inCount>
 consteval std::array<std::string_view, inCount> KeysOf(const std::array<KeyFor<Value>, inCount>& inTable)
 {
-	std::array<std::string_view, inCount> keys;
+	std::array<std::string_view, inCount> keys{};
 	std::ranges::transform(inTable, keys.begin(), &KeyFor<Value>::mKey);
 	return keys;
 }
@@ -43,7 +43,7 @@ template <std::size_t... inCounts>
 consteval std::array<std::string_view, (inCounts + ... + 0)> JoinKeys(
 	const std::array<std::string_view, inCounts>&... inKeys)
 {
-	std::array<std::string_view, (inCounts + ... + 0)> joined;
+	std::array<std::string_view, (inCounts + ... + 0)> joined{};
 	[[maybe_unused]] auto end = joined.begin();
 	((end = std::ranges::copy(inKeys, end).out), ...);
 	return joined;
