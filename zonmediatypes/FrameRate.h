@@ -1,0 +1,158 @@
+#pragma once
+
+/// \file
+/// Frame rates and sample rates, as the duration of one frame or sample in ticks.
+///
+/// One second is 254,016,000,000 ticks, so one frame of every rate named here is a whole number of ticks. A larger
+/// duration is a slower rate. Multiplying and dividing scale the rate, and so act inversely on the duration:
+///
+///     kFrameRate_VideoNTSC * 2;      // kFrameRate_VideoNTSC_HD
+///     kFrameRate_VideoPAL_HD / 2;    // kFrameRate_VideoPAL
+///
+/// Rates are passed by value, no operation allocates memory, and every function but the stream operators is a few
+/// instructions.
+
+#include "zoncore/NumberConversion.h"
+#include "zoncore/WrappingArithmetic.h"
+#include "zonmediatypes/Export.h"
+
+#include <cstdint>
+#include <iosfwd>
+#include <limits>
+#include <span>
+
+namespace zonmediatypes
+{
+
+/// The unit of all media time: ticks in one second, 2^12 · 3^4 · 5^6 · 7^2.
+inline constexpr std::int64_t kTicksPerSecond = 254'016'000'000;
+
+class FrameRate
+{
+public:
+	/// kFrameRate_Zero: no rate at all.
+	constexpr FrameRate() noexcept = default;
+
+	/// The rate whose frames last inTicksPerFrame ticks each. Any number is accepted; see IsUsable().
+	explicit constexpr FrameRate(std::int64_t inTicksPerFrame) noexcept : mTicksPerFrame(inTicksPerFrame) {}
+
+	constexpr std::int64_t GetTicksPerFrame() const noexcept { return mTicksPerFrame; }
+
+	/// False for a duration of 0 and for that of kFrameRate_Zero, which give neutral results wherever frames are counted.
+	/// Negative durations count as usable: the formulas are carried out as they stand.
+	constexpr bool IsUsable() const noexcept { return mTicksPerFrame != 0 && mTicksPerFrame != kNoRate; }
+
+	/// The rate becomes inValue times faster: the duration is divided by inValue. An integer division truncates toward zero
+	/// and has no check: 0 is a divide fault. A division by a double truncates toward zero, too; it gives the most negative
+	/// duration for a quotient that is infinite, NaN or out of range.
+	constexpr FrameRate& operator*=(int inValue) noexcept;
+	constexpr FrameRate& operator*=(double inValue) noexcept;
+	friend constexpr FrameRate operator*(FrameRate inRate, int inValue) noexcept { return inRate *= inValue; }
+	friend constexpr FrameRate operator*(FrameRate inRate, double inValue) noexcept { return inRate *= inValue; }
+
+	/// The rate becomes inValue times slower: the duration is multiplied by inValue, wrapping for an integer, truncated
+	/// toward zero for a double. kFrameRate_Film24 / 1.001 is one tick short of kFrameRate_23976, because the product of
+	/// doubles is just below a whole number: use the constants where a rate must be exact.
+	constexpr FrameRate& operator/=(int inValue) noexcept;
+	constexpr FrameRate& operator/=(double inValue) noexcept;
+	friend constexpr FrameRate operator/(FrameRate inRate, int inValue) noexcept { return inRate /= inValue; }
+	friend constexpr FrameRate operator/(FrameRate inRate, double inValue) noexcept { return inRate /= inValue; }
+
+	friend constexpr bool operator==(FrameRate inLHS, FrameRate inRHS) noexcept = default;
+
+private:
+	static constexpr std::int64_t kNoRate = std::numeric_limits<std::int64_t>::max();
+
+	std::int64_t mTicksPerFrame = kNoRate;
+};
+
+/// The rate of inFrames frames every inSeconds seconds. Does not compile when one frame is not a whole number of ticks.
+consteval FrameRate FramesPerSecond(std::int64_t inFrames, std::int64_t inSeconds = 1)
+{
+	if (kTicksPerSecond * inSeconds % inFrames != 0)
+		throw "this rate has no exact duration in ticks";
+	return FrameRate(kTicksPerSecond * inSeconds / inFrames);
+}
+
+// ---- Named rates -----------------------------------------------------------------------------------------------------
+
+// clang-format off
+inline constexpr FrameRate kFrameRate_Video10      = FramesPerSecond(10);
+inline constexpr FrameRate kFrameRate_Video12      = FramesPerSecond(12);
+inline constexpr FrameRate kFrameRate_Video12_5    = FramesPerSecond(25, 2);
+inline constexpr FrameRate kFrameRate_Video15      = FramesPerSecond(15);
+inline constexpr FrameRate kFrameRate_23976        = FramesPerSecond(24'000, 1'001);
+inline constexpr FrameRate kFrameRate_Film24       = FramesPerSecond(24);
+inline constexpr FrameRate kFrameRate_VideoPAL     = FramesPerSecond(25);
+inline constexpr FrameRate kFrameRate_VideoNTSC    = FramesPerSecond(30'000, 1'001);
+inline constexpr FrameRate kFrameRate_Video30      = FramesPerSecond(30);
+inline constexpr FrameRate kFrameRate_Film48       = FramesPerSecond(48);
+inline constexpr FrameRate kFrameRate_VideoPAL_HD  = FramesPerSecond(50);
+inline constexpr FrameRate kFrameRate_VideoNTSC_HD = FramesPerSecond(60'000, 1'001);
+inline constexpr FrameRate kFrameRate_Video60      = FramesPerSecond(60);
+inline constexpr FrameRate kFrameRate_Video100     = FramesPerSecond(100);
+inline constexpr FrameRate kFrameRate_Video1000    = FramesPerSecond(1'000);     ///< one frame is one millisecond
+inline constexpr FrameRate kFrameRate_Audio8000    = FramesPerSecond(8'000);     ///< the slowest audio rate: slower ones are video
+inline constexpr FrameRate kFrameRate_Audio11025   = FramesPerSecond(11'025);
+inline constexpr FrameRate kFrameRate_Audio22050   = FramesPerSecond(22'050);
+inline constexpr FrameRate kFrameRate_Audio32000   = FramesPerSecond(32'000);
+inline constexpr FrameRate kFrameRate_Audio44100   = FramesPerSecond(44'100);
+inline constexpr FrameRate kFrameRate_Audio48000   = FramesPerSecond(48'000);
+inline constexpr FrameRate kFrameRate_Audio88200   = FramesPerSecond(88'200);
+inline constexpr FrameRate kFrameRate_Audio96000   = FramesPerSecond(96'000);
+inline constexpr FrameRate kFrameRate_Audio192000  = FramesPerSecond(192'000);
+inline constexpr FrameRate kFrameRate_Zero;                                      ///< no rate: one frame lasts for ever
+// clang-format on
+
+/// All named rates in the order above, kFrameRate_Zero last.
+ZONMEDIATYPES_API std::span<const FrameRate> AllFrameRates() noexcept;
+
+// ---- Functions -------------------------------------------------------------------------------------------------------
+
+/// How many times faster inA is than inB. 0.0 when inA's duration is 0; a very large number, not 0, when inB is
+/// kFrameRate_Zero.
+constexpr double GetFrameRateRatio(FrameRate inA, FrameRate inB) noexcept;
+
+/// Writes the rate in frames or samples per second with at most two decimals, kFrameRate_23976 with three: "25", "12.5",
+/// "29.97", "23.976"; kFrameRate_Zero is "0", a duration of 0 "inf". The text is padded as any text; the other settings of
+/// the stream have no effect.
+ZONMEDIATYPES_API std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, FrameRate inRate);
+ZONMEDIATYPES_API std::basic_ostream<unsigned short>& operator<<(
+	std::basic_ostream<unsigned short>& inStream, FrameRate inRate);
+ZONMEDIATYPES_API std::basic_ostream<unsigned char>& operator<<(
+	std::basic_ostream<unsigned char>& inStream, FrameRate inRate);
+
+// ---- Inline implementation -------------------------------------------------------------------------------------------
+
+constexpr FrameRate& FrameRate::operator*=(int inValue) noexcept
+{
+	mTicksPerFrame = zoncore::utility::WrappingDivide(mTicksPerFrame, inValue);
+	return *this;
+}
+
+constexpr FrameRate& FrameRate::operator*=(double inValue) noexcept
+{
+	mTicksPerFrame = zoncore::utility::TruncateTo<std::int64_t>(static_cast<double>(mTicksPerFrame) / inValue);
+	return *this;
+}
+
+constexpr FrameRate& FrameRate::operator/=(int inValue) noexcept
+{
+	mTicksPerFrame = zoncore::utility::WrappingMultiply(mTicksPerFrame, inValue);
+	return *this;
+}
+
+constexpr FrameRate& FrameRate::operator/=(double inValue) noexcept
+{
+	mTicksPerFrame = zoncore::utility::TruncateTo<std::int64_t>(static_cast<double>(mTicksPerFrame) * inValue);
+	return *this;
+}
+
+constexpr double GetFrameRateRatio(FrameRate inA, FrameRate inB) noexcept
+{
+	if (inA.GetTicksPerFrame() == 0)
+		return 0.0;
+	return static_cast<double>(inB.GetTicksPerFrame()) / static_cast<double>(inA.GetTicksPerFrame());
+}
+
+}   // namespace zonmediatypes
