@@ -6,6 +6,8 @@
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
+#include "zonmediatypes/TimeDisplayUtils.h"
+#include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/Version.h"
 
 namespace zonmediatypes

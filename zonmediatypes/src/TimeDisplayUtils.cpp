@@ -1,0 +1,83 @@
+#include "zonmediatypes/TimeDisplayUtils.h"
+
+#include "zonmediatypes/src/TimeDisplayTable.h"
+
+#include <algorithm>
+
+namespace zonmediatypes
+{
+namespace
+{
+
+constexpr auto sAllTimeDisplays = []
+{
+	std::array<TimeDisplay, kTimeDisplayTable.size()> displays{};
+	std::ranges::transform(kTimeDisplayTable, displays.begin(), &TimeDisplayRow::mDisplay);
+	return displays;
+}();
+
+// Not the rates below 22,050 Hz: a host that shows those picks the display itself.
+constexpr auto sSampleDisplayRates = std::to_array<FrameRate>({
+	kFrameRate_Audio22050,
+	kFrameRate_Audio32000,
+	kFrameRate_Audio44100,
+	kFrameRate_Audio48000,
+	kFrameRate_Audio88200,
+	kFrameRate_Audio96000,
+	kFrameRate_Audio192000,
+});
+
+}   // namespace
+
+std::span<const TimeDisplay> AllTimeDisplays() noexcept
+{
+	return sAllTimeDisplays;
+}
+
+TimeDisplay GetTimeDisplayForFrameRate(
+	FrameRate inRate, bool inDropFrame, bool /*inUnused*/, TimeDisplay inDefault, bool inAllowMilliseconds) noexcept
+{
+	const FrameNumbering other = inDropFrame ? FrameNumbering::NonDrop : FrameNumbering::Drop;
+	const auto fits = [&](const TimeDisplayRow& inRow)
+	{
+		return inRow.mRate == inRate && inRow.mNumbering != other
+			&& (inRow.mKind == DisplayKind::Timecode
+				|| (inRow.mKind == DisplayKind::Milliseconds && inAllowMilliseconds));
+	};
+	if (const auto row = std::ranges::find_if(kTimeDisplayTable, fits); row != kTimeDisplayTable.end())
+		return row->mDisplay;
+	return std::ranges::find(sSampleDisplayRates, inRate) != sSampleDisplayRates.end() ? kTimeDisplay_AudioSamples
+																					   : inDefault;
+}
+
+FrameRate GetFrameRateForTimeDisplay(TimeDisplay inDisplay, FrameRate inRate) noexcept
+{
+	const TimeDisplayRow& row = FindTimeDisplay(inDisplay);
+	return row.CountsAtCallersRate() ? inRate : row.mRate;
+}
+
+bool IsTimeDisplayFormatAudio(TimeDisplay inDisplay) noexcept
+{
+	const DisplayKind kind = FindTimeDisplay(inDisplay).mKind;
+	return kind == DisplayKind::Samples || kind == DisplayKind::Milliseconds;
+}
+
+bool IsTimeDisplayDropFrame(TimeDisplay inDisplay) noexcept
+{
+	return FindTimeDisplay(inDisplay).mNumbering == FrameNumbering::Drop;
+}
+
+bool IsDropFrameApplicableForTimeDisplay(TimeDisplay inDisplay) noexcept
+{
+	return FindTimeDisplay(inDisplay).mNumbering != FrameNumbering::Straight;
+}
+
+bool IsHMSFTimeDisplay(TimeDisplay inDisplay, bool inFramesAsHMSF) noexcept
+{
+	const DisplayKind kind = FindTimeDisplay(inDisplay).mKind;
+	if (kind == DisplayKind::Frames)
+		return inFramesAsHMSF;
+	return kind != DisplayKind::Film && kind != DisplayKind::Auto;
+}
+
+}   // namespace zonmediatypes
