@@ -1,5 +1,5 @@
-#include "zoncore/Localizer.h"
 #include "zoncore/MessageCatalogue.h"
+#include "zoncore/Localizer.h"
 #include "zoncore/StringUtils.h"
 
 #include <gmock/gmock.h>
@@ -71,7 +71,8 @@ TEST(MessageCatalogue, FindsByPathAndEnglishTextInEitherByteOrder)
 		EXPECT_EQ(catalogue.Find("$$$/a/Draft2=Draft"), "Entwurf 2");
 		EXPECT_EQ(catalogue.Find("$$$/a/High=High"), "Hoch");
 		EXPECT_EQ(catalogue.Find("$$$/ab"), "leer");
-		for (const std::string_view absent : {"$$$/a/Draft=Drafts", "$$$/a/Draf=Draft", "$$$/a/Draft3=Draft", "", "=", "Mono", "~=x"})
+		for (const std::string_view absent :
+			{"$$$/a/Draft=Drafts", "$$$/a/Draf=Draft", "$$$/a/Draft3=Draft", "", "=", "Mono", "~=x"})
 			EXPECT_EQ(catalogue.Find(absent), "") << absent;
 	}
 }

@@ -55,7 +55,7 @@ private:
 		std::string_view mText;
 	};
 
-	std::vector<char> mBytes;          // what the messages refer to; a vector keeps its bytes in place when moved
+	std::vector<char> mBytes;         // what the messages refer to; a vector keeps its bytes in place when moved
 	std::vector<Message> mMessages;   // sorted by mId
 };
 

@@ -39,7 +39,10 @@ class Bytes
 public:
 	explicit Bytes(std::string_view inBytes) : mBytes(inBytes) {}
 
-	bool Has(std::size_t inAt, std::size_t inCount) const { return inAt <= mBytes.size() && inCount <= mBytes.size() - inAt; }
+	bool Has(std::size_t inAt, std::size_t inCount) const
+	{
+		return inAt <= mBytes.size() && inCount <= mBytes.size() - inAt;
+	}
 
 	// The word at inAt, which must be there, lowest byte first unless the other order was chosen.
 	std::uint32_t Word(std::size_t inAt) const
@@ -93,7 +96,8 @@ bool SaysUTF8(std::string_view inHeader)
 {
 	constexpr std::string_view kCharset = "charset=";
 	const std::size_t found = inHeader.find(kCharset);
-	const std::string_view charset = found == std::string_view::npos ? std::string_view() : inHeader.substr(found + kCharset.size());
+	const std::string_view charset
+		= found == std::string_view::npos ? std::string_view() : inHeader.substr(found + kCharset.size());
 	return charset.starts_with("UTF-8") || charset.starts_with("utf-8");
 }
 
@@ -135,7 +139,8 @@ bool MessageCatalogue::Parse(std::string_view inBytes, std::string& outError)
 		if (!bytes.Text(bytes.Word(kIdTableAt) + i * kEntryBytes, message.mId)
 			|| !bytes.Text(bytes.Word(kTextTableAt) + i * kEntryBytes, message.mText))
 		{
-			outError = "is a damaged message catalogue: the text of message " + std::to_string(i) + " lies outside the file";
+			outError
+				= "is a damaged message catalogue: the text of message " + std::to_string(i) + " lies outside the file";
 			return false;
 		}
 		if (message.mId.empty())

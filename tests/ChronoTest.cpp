@@ -1,0 +1,99 @@
+#include "zonmediatypes/interop/Chrono.h"
+
+#include <boost/multiprecision/cpp_int.hpp>
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+#include <random>
+
+namespace zonmediatypes
+{
+namespace
+{
+
+using namespace std::chrono_literals;
+using Wide = boost::multiprecision::int256_t;
+
+constexpr std::int64_t kMin = std::numeric_limits<std::int64_t>::min();
+constexpr std::int64_t kMax = std::numeric_limits<std::int64_t>::max();
+
+static_assert(ToTickTime(40ms) == TickTime(kFrameRate_VideoPAL.GetTicksPerFrame()));
+static_assert(ToTickTime(1us) == TickTime(254'016) && ToTickTime(100h) == kTime_Max);
+static_assert(ToTickTime(std::chrono::duration<int, std::ratio<1, 90'000>>(-3)) == TickTime(-8'467'200));
+static_assert(
+	ToTickTime(1ns, Rounding::Nearest) == TickTime(254) && ToTickTime(-1ns, Rounding::Down) == TickTime(-255));
+static_assert(!ToTickTime(std::chrono::hours(20'000)) && !ToTickTime(std::chrono::duration<std::uint64_t>(~0ull)));
+static_assert(ToDuration(kTime_Max) == 100h);
+static_assert(ToDuration<std::chrono::milliseconds>(TickTime(-1), Rounding::Up) == 0ms);
+static_assert(ToDuration<std::chrono::milliseconds>(TickTime(-1), Rounding::Down) == -1ms);
+static_assert(!ToDuration<std::chrono::duration<std::int8_t>>(kTime_Max, Rounding::Nearest));
+
+// The definition of each rounding, in numbers that cannot overflow.
+Wide RoundedQuotient(const Wide& inDividend, const Wide& inDivisor, Rounding inRounding)
+{
+	const Wide magnitude = abs(inDividend);
+	const bool isNegative = inDividend < 0;
+	const Wide below = magnitude / inDivisor;
+	const bool goesUp = inRounding == Rounding::Nearest ? 2 * (magnitude % inDivisor) >= inDivisor
+		: inRounding == Rounding::TowardZero            ? false
+		: (inRounding == Rounding::Up) != isNegative    ? magnitude % inDivisor != 0
+														: false;
+	const Wide rounded = below + (goesUp ? 1 : 0);
+	return isNegative ? Wide(-rounded) : rounded;
+}
+
+std::optional<std::int64_t> Narrowed(const Wide& inValue)
+{
+	return inValue >= kMin && inValue <= kMax ? std::optional(static_cast<std::int64_t>(inValue)) : std::nullopt;
+}
+
+TEST(TimeBase, RoundsExactlyOverTheWholeRange)
+{
+	std::mt19937_64 random(1);
+	const std::pair<std::int64_t, std::int64_t> ratios[]
+		= {{1, 90'000}, {1, 1'000'000}, {1, 1'000'000'000}, {1'001, 30'000}, {1, 48'000}, {7, 3}, {1, 254'016'000'000},
+			{1, 508'032'000'000}, {1, kMax}, {36'000'000, 1}, {9'999'937, 1'000'003}};
+	for (const auto& [numerator, denominator] : ratios)
+	{
+		const auto base = TimeBase::FromRatio(numerator, denominator);
+		ASSERT_TRUE(base) << numerator << '/' << denominator;
+		for (int i = 0; i < 2'000; ++i)
+		{
+			const std::int64_t edges[] = {0, 1, -1, kMin, kMax, kMin + 1};
+			const auto value
+				= i < 6 ? edges[i] : static_cast<std::int64_t>(random()) >> static_cast<int>(random() % 64);
+			for (const Rounding rounding : {Rounding::TowardZero, Rounding::Down, Rounding::Up, Rounding::Nearest})
+			{
+				const Wide units
+					= RoundedQuotient(Wide(value) * denominator, Wide(kTicksPerSecond) * numerator, rounding);
+				const Wide ticks = RoundedQuotient(Wide(value) * kTicksPerSecond * numerator, denominator, rounding);
+				EXPECT_EQ(base->FromTicks(TickTime(value), rounding), Narrowed(units));
+				const auto gotTicks = base->ToTicks(value, rounding);
+				EXPECT_EQ(gotTicks ? std::optional(gotTicks->GetTicks()) : std::nullopt, Narrowed(ticks));
+			}
+		}
+	}
+}
+
+TEST(TimeBase, IsEmptyForWhatIsNoUnit)
+{
+	EXPECT_FALSE(TimeBase::FromRatio(0, 1) || TimeBase::FromRatio(1, 0) || TimeBase::FromRatio(-1, -1));
+	EXPECT_FALSE(TimeBase::FromRatio(kMax, 1));
+	EXPECT_FALSE(
+		TimeBase::FromRate(kFrameRate_Zero) || TimeBase::FromRate(FrameRate(0)) || TimeBase::FromRate(FrameRate(-5)));
+	EXPECT_EQ(TimeBase::FromRatio(2'002, 60'000), TimeBase::FromRate(kFrameRate_VideoNTSC));
+}
+
+TEST(Chrono, TakesAndGivesFloatingPointDurations)
+{
+	using Seconds = std::chrono::duration<double>;
+	EXPECT_EQ(ToDuration<Seconds>(kTime_Max).count(), 360'000.0);
+	EXPECT_EQ(ToTickTime(Seconds(0.5)), TickTime(kTicksPerSecond / 2));
+	EXPECT_EQ(ToTickTime(Seconds(-1.0 / 508'032'000'000)), TickTime(-1));
+	for (const double none : {std::nan(""), HUGE_VAL, -HUGE_VAL, 4e7})
+		EXPECT_FALSE(ToTickTime(Seconds(none)));
+}
+
+}   // namespace
+}   // namespace zonmediatypes
