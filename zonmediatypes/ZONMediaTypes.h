@@ -3,6 +3,7 @@
 /// \file
 /// The whole library in one header, and the entry points that a client calls around its use of it.
 
+#include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
