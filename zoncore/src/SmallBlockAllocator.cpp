@@ -198,7 +198,7 @@ void* SmallBlockAllocator::Allocate(std::size_t inSize)
 	return ::operator new(inSize);
 }
 
-void SmallBlockAllocator::Dispose(void* inBlock, std::size_t inSize) noexcept
+void SmallBlockAllocator::Dispose(void* inBlock, [[maybe_unused]] std::size_t inSize) noexcept
 {
 	if (inBlock != nullptr)
 		::operator delete(inBlock);
