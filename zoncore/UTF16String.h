@@ -3,9 +3,15 @@
 /// \file
 /// 16-bit text: the string of UTF-16 code units that all display text is, and streams over it.
 ///
-/// The streams format and read integers and doubles as a `char` stream with the classic locale does, width, fill and
-/// precision included, whatever the global locale is. A code unit is a number to a stream (`stream << UTF16Char(65)`
-/// writes "65"); text is written as UTF16String, as UTF16Char*, or character by character with put().
+///     oUTF16StringStream stream;
+///     stream << std::setw(4) << std::setfill(UTF16Char('0')) << 12 << " " << 29.97 << " fps";
+///     stream.str();   // "0012 29.97 fps"
+///
+/// The streams format and read integers, doubles and Booleans as a `char` stream with the classic locale does, width, fill
+/// and precision included, whatever the global locale is. Text is written as UTF16String, as UTF16Char*, as a narrow literal
+/// (" fps"), or character by character with put(). A single code unit is a number to `<<` and `>>`, and so is a narrow
+/// character: `stream << UTF16Char(65)` and `stream << 'A'` write "65". A stream is for one thread at a time, as standard
+/// streams are.
 ///
 /// The standard library has no character facets for 16-bit characters; they are declared here and live in this library,
 /// so that a stream made on one side of a shared library's boundary works on the other.
@@ -22,15 +28,20 @@
 #include <streambuf>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace zoncore
 {
 
-/// One UTF-16 code unit.
+/// One UTF-16 code unit; any value is legal, lone surrogates and 0 included.
 using UTF16Char = unsigned short;
+
+/// Text of UTF-16 code units. Up to seven are held without memory from the allocator.
 
 using UTF16String
 	= std::basic_string<UTF16Char, std::char_traits<UTF16Char>, utility::SmallBlockAllocator::Allocator<UTF16Char>>;
+
+/// Text that somebody else holds.
 using UTF16StringView = std::basic_string_view<UTF16Char>;
 
 }   // namespace zoncore
@@ -102,7 +113,7 @@ namespace zoncore
 /// stream of another kind is given it with imbue().
 ZONCORE_API const std::locale& ClassicUTF16Locale();
 
-/// A standard string stream with the classic facets for 16-bit characters.
+/// A standard string stream with the classic facets for 16-bit characters; it moves and swaps as the standard one does.
 template <class Stream>
 class ClassicUTF16Stream : public Stream
 {
@@ -111,6 +122,14 @@ public:
 	explicit ClassicUTF16Stream(std::ios_base::openmode inMode) : Stream(inMode) { Imbue(); }
 	explicit ClassicUTF16Stream(const UTF16String& inText) : Stream(inText) { Imbue(); }
 	ClassicUTF16Stream(const UTF16String& inText, std::ios_base::openmode inMode) : Stream(inText, inMode) { Imbue(); }
+
+	// Written out: the virtual base of streams does not move by itself, the standard streams move what it holds.
+	ClassicUTF16Stream(ClassicUTF16Stream&& ioOther) : Stream(std::move(ioOther)) {}
+	ClassicUTF16Stream& operator=(ClassicUTF16Stream&& ioOther)
+	{
+		Stream::operator=(std::move(ioOther));
+		return *this;
+	}
 
 private:
 	void Imbue() { this->imbue(ClassicUTF16Locale()); }
