@@ -3,8 +3,14 @@
 /// \file
 /// Conversions between 8-bit and 16-bit text, and replacement in 16-bit text.
 ///
-/// Nothing here throws but what memory running out throws. Malformed input gives U+FFFD for each maximal ill-formed
-/// piece, as the Unicode Standard recommends (a maximal subpart: FF FF gives two, E2 82 one).
+///     UTF16String title = UTF8to16("Take @0");
+///     ReplaceInString(title, AsciiToUTF16("@0"), Coercion(12));
+///     UTF16to8(title);   // "Take 12"
+///
+/// Any input is legal: malformed text gives U+FFFD for each maximal ill-formed piece, as the Unicode Standard recommends
+/// (FF FF gives two, E2 82 one, two lone surrogates two). Nothing here throws but what memory running out throws, and
+/// nothing depends on a locale. Costs are linear in the text, one allocation where the result does not fit into the
+/// string object itself. Safe on any thread.
 
 #include "zoncore/Export.h"
 #include "zoncore/UTF16String.h"
@@ -15,24 +21,24 @@
 namespace zoncore::utility
 {
 
-/// ASCII text as UTF-16; each byte above 7F gives U+FFFD.
+/// ASCII text as UTF-16; each byte above 7F gives U+FFFD. Zero bytes are characters like others.
 ZONCORE_API UTF16String AsciiToUTF16(std::string_view inText);
 
-/// UTF-8 text as UTF-16.
+/// UTF-8 text as UTF-16. Overlong forms, surrogates and code points above 10FFFF are ill-formed. A byte order mark is kept.
 ZONCORE_API UTF16String UTF8to16(std::string_view inText);
 
 /// UTF-16 text as UTF-8; each lone surrogate gives U+FFFD.
 ZONCORE_API std::string UTF16to8(UTF16StringView inText);
-inline std::string UTF16to8(const UTF16String& inText)
-{
-	return UTF16to8(UTF16StringView(inText));
-}
+inline std::string UTF16to8(const UTF16String& inText) { return UTF16to8(UTF16StringView(inText)); }
+inline std::string UTF16to8(const UTF16Char* inText) { return UTF16to8(UTF16StringView(inText)); }
 
 /// Replaces every occurrence of inWhat in ioText by inWith, from the first to the last; what was put in is never searched
-/// again. An empty inWhat changes nothing. The arguments may be the same object. When memory runs out ioText is as before.
+/// again, so "aaa" with "aa" for "a" is "aaaaaa". An empty inWhat changes nothing. The arguments may be the same object.
+/// When memory runs out ioText is as before.
 ZONCORE_API void ReplaceInString(UTF16String& ioText, const UTF16String& inWhat, const UTF16String& inWith);
 
-/// The value as a fresh 16-bit stream writes it.
+/// The value as a fresh 16-bit stream writes it: numbers as with std::ostream and the classic locale (doubles with six
+/// significant digits), a UTF16Char as its number. Costs a stream; where speed matters, write digits directly.
 template <class T>
 UTF16String Coercion(const T& inValue)
 {

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 #include <cstddef>
-#include <cstdint>
+#include <type_traits>
 
 namespace zoncore::utility
 {
@@ -16,6 +16,19 @@ constexpr char32_t kLowSurrogate = 0xDC00;
 constexpr char32_t kSurrogateMask = 0xFC00;
 constexpr char32_t kSurrogatePayload = 0x3FF;
 constexpr unsigned kSurrogateBits = 10;
+
+template <class Char>
+constexpr bool IsAscii(Char inChar)
+{
+	return static_cast<std::make_unsigned_t<Char>>(inChar) < 0x80;
+}
+
+// The length of the ASCII text at the start of inText.
+template <class Char>
+std::size_t CountAscii(std::basic_string_view<Char> inText)
+{
+	return static_cast<std::size_t>(std::ranges::find_if_not(inText, IsAscii<Char>) - inText.begin());
+}
 
 struct Decoded
 {
@@ -52,7 +65,7 @@ constexpr LeadByte ReadLeadByte(unsigned char inByte)
 Decoded DecodeUTF8(std::string_view inText)
 {
 	const auto first = static_cast<unsigned char>(inText.front());
-	if (first < 0x80)
+	if (IsAscii(first))
 		return {first, 1};
 	const LeadByte lead = ReadLeadByte(first);
 	if (lead.mContinuations == 0)
@@ -84,16 +97,18 @@ Decoded DecodeUTF16(UTF16StringView inText)
 	return {isSurrogate ? kReplacementCharacter : first, 1};
 }
 
-void AppendUTF16(UTF16String& ioText, char32_t inCodePoint)
+// Writes a code point at outText and returns the place behind it: one code unit or two.
+UTF16Char* WriteUTF16(UTF16Char* outText, char32_t inCodePoint)
 {
 	if (inCodePoint < kFirstSupplementary)
 	{
-		ioText.push_back(static_cast<UTF16Char>(inCodePoint));
-		return;
+		*outText = static_cast<UTF16Char>(inCodePoint);
+		return outText + 1;
 	}
 	const char32_t payload = inCodePoint - kFirstSupplementary;
-	ioText.push_back(static_cast<UTF16Char>(kHighSurrogate | payload >> kSurrogateBits));
-	ioText.push_back(static_cast<UTF16Char>(kLowSurrogate | (payload & kSurrogatePayload)));
+	outText[0] = static_cast<UTF16Char>(kHighSurrogate | payload >> kSurrogateBits);
+	outText[1] = static_cast<UTF16Char>(kLowSurrogate | (payload & kSurrogatePayload));
+	return outText + 2;
 }
 
 void AppendUTF8(std::string& ioText, char32_t inCodePoint)
@@ -129,32 +144,38 @@ void AppendUTF8(std::string& ioText, char32_t inCodePoint)
 UTF16String AsciiToUTF16(std::string_view inText)
 {
 	UTF16String text(inText.size(), 0);
-	std::transform(inText.begin(), inText.end(), text.begin(),
-		[](char inChar)
-		{
-			const auto byte = static_cast<unsigned char>(inChar);
-			return static_cast<UTF16Char>(byte < 0x80 ? byte : kReplacementCharacter);
-		});
+	std::ranges::transform(inText, text.begin(),
+		[](unsigned char inByte) { return static_cast<UTF16Char>(IsAscii(inByte) ? inByte : kReplacementCharacter); });
 	return text;
 }
 
 UTF16String UTF8to16(std::string_view inText)
 {
-	UTF16String text;
-	text.reserve(inText.size());
+	// No form of a code point has more code units in UTF-16 than bytes in UTF-8, and nor has U+FFFD for an ill-formed piece.
+	UTF16String text(inText.size(), 0);
+	UTF16Char* end = text.data();
 	while (!inText.empty())
 	{
+		const std::size_t ascii = CountAscii(inText);
+		end = std::copy_n(inText.begin(), ascii, end);
+		inText.remove_prefix(ascii);
+		if (inText.empty())
+			break;
 		const Decoded decoded = DecodeUTF8(inText);
-		AppendUTF16(text, decoded.mCodePoint);
+		end = WriteUTF16(end, decoded.mCodePoint);
 		inText.remove_prefix(decoded.mLength);
 	}
+	text.resize(static_cast<std::size_t>(end - text.data()));
 	return text;
 }
 
 std::string UTF16to8(UTF16StringView inText)
 {
-	std::string text;
-	text.reserve(inText.size());
+	const std::size_t ascii = CountAscii(inText);
+	std::string text(ascii, '\0');
+	std::ranges::transform(
+		inText.substr(0, ascii), text.begin(), [](UTF16Char inChar) { return static_cast<char>(inChar); });
+	inText.remove_prefix(ascii);
 	while (!inText.empty())
 	{
 		const Decoded decoded = DecodeUTF16(inText);
