@@ -1,7 +1,7 @@
 #pragma once
 
 /// \file
-/// Conversions between numbers, and between numbers and text. None depends on a locale.
+/// Conversions between numbers, and between numbers and text. None depends on a locale; all are safe on any thread.
 
 #include "zoncore/Export.h"
 #include "zoncore/Flags.h"
@@ -34,6 +34,8 @@ inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
 /// The integer part is padded with zeros to inMinIntegerDigits (0 acts as 1). A negative value that rounds to zero has no
 /// sign. Text of more than inMaxLength characters, sign included, is written as printf's "%g" writes it instead
 /// ("1.79769e+308"). Infinities are "inf" and "-inf", NaN is "nan".
+///
+/// Counts of any size are legal: text that no memory holds is longer than inMaxLength. The result is what is allocated.
 ZONCORE_API UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, unsigned long inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength);
 
@@ -41,6 +43,9 @@ ZONCORE_API UTF16String NumberToString(double inValue, unsigned long inMinIntege
 /// also "." with more digits and an exponent that has digits. What follows is ignored. False, and 0, when there are no
 /// digits or when an integer is out of range; a double out of range is the infinity of its sign, or zero, with true.
 /// inOptions is accepted and changes nothing.
+///
+/// Doubles are correctly rounded (exact halves to even) whatever the number of digits. No memory is allocated, and the
+/// time is linear in the length of the number.
 ZONCORE_API bool StringToNumber(UTF16StringView inText, int& outValue, unsigned inOptions);
 ZONCORE_API bool StringToNumber(UTF16StringView inText, long long& outValue, unsigned inOptions);
 ZONCORE_API bool StringToNumber(UTF16StringView inText, double& outValue, unsigned inOptions);
@@ -53,6 +58,7 @@ bool StringToNumber(const UTF16String& inText, Number& outValue, unsigned inOpti
 
 /// The fraction closest to inValue with both terms in -2147483646..2147483646; of two equally close ones that with the
 /// smaller denominator, then the one nearer to zero. NaN gives 0/1; a larger magnitude gives plus or minus 2147483646/1.
+/// The closest fraction to a rounded quotient need not be the quotient's own. Costs some dozens of divisions at most.
 ///
 /// Compare a boost::rational with a boost::rational only: with a bare integer the comparison never returns in C++20 with
 /// the supported compilers and Boost.

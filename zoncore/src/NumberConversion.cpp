@@ -3,11 +3,11 @@
 #include "zoncore/StringUtils.h"
 
 #include <algorithm>
-#include <boost/multiprecision/cpp_int.hpp>
+#include <array>
 #include <charconv>
 #include <cmath>
 #include <cstddef>
-#include <string>
+#include <span>
 #include <string_view>
 #include <system_error>
 #include <utility>
@@ -20,34 +20,34 @@ namespace
 // ---- Numbers to text -------------------------------------------------------------------------------------------------
 
 constexpr std::size_t kMostIntegerDigits = 309;   // of a finite double
-constexpr std::size_t kMostDecimals = 1074;       // beyond these every double has zeros only
+constexpr std::size_t kMostDecimals = 1'074;      // beyond these every double has zeros only
+constexpr std::size_t kLongestFixedText = kMostIntegerDigits + 1 + kMostDecimals;
 constexpr int kGeneralDigits = 6;                 // the precision of "%g"
 
-std::string GeneralText(double inValue)
+UTF16String GeneralText(double inValue)
 {
-	char buffer[32];
-	const auto result = std::to_chars(buffer, std::end(buffer), inValue, std::chars_format::general, kGeneralDigits);
-	return {buffer, result.ptr};
+	std::array<char, 32> buffer;
+	const auto result = std::to_chars(
+		buffer.data(), buffer.data() + buffer.size(), inValue, std::chars_format::general, kGeneralDigits);
+	return AsciiToUTF16({buffer.data(), result.ptr});
 }
 
 // The digits of inMagnitude, rounded; no more decimals than a double can have.
-std::string FixedText(double inMagnitude, unsigned long inDecimals)
+std::string_view FixedText(double inMagnitude, unsigned long inDecimals, std::span<char, kLongestFixedText> outBuffer)
 {
-	std::string text(kMostIntegerDigits + 1 + kMostDecimals, '\0');
+	char* const begin = outBuffer.data();
 	const auto decimals = static_cast<int>(std::min<unsigned long>(inDecimals, kMostDecimals));
 	const auto result
-		= std::to_chars(text.data(), text.data() + text.size(), inMagnitude, std::chars_format::fixed, decimals);
-	text.resize(static_cast<std::size_t>(result.ptr - text.data()));
-	return text;
+		= std::to_chars(begin, begin + outBuffer.size(), inMagnitude, std::chars_format::fixed, decimals);
+	return {begin, result.ptr};
 }
 
-void DropTrailingZeros(std::string& ioText)
+std::string_view WithoutTrailingZeros(std::string_view inText)
 {
-	if (ioText.find('.') == std::string::npos)
-		return;
-	ioText.erase(ioText.find_last_not_of('0') + 1);
-	if (ioText.back() == '.')
-		ioText.pop_back();
+	if (inText.find('.') == std::string_view::npos)
+		return inText;
+	const std::size_t last = inText.find_last_not_of('0');
+	return inText.substr(0, inText[last] == '.' ? last : last + 1);
 }
 
 // ---- Text to numbers -------------------------------------------------------------------------------------------------
@@ -97,12 +97,11 @@ bool ReadInteger(UTF16StringView inText, Integer& outValue)
 	outValue = 0;
 	const NumberText number = SkipToNumber(inText);
 	const std::size_t digits = CountDigits(number.mText);
-	using Wide = std::uint64_t;
-	const Wide largest = static_cast<Wide>(std::numeric_limits<Integer>::max()) + (number.mIsNegative ? 1 : 0);
-	Wide magnitude = 0;
+	const std::uint64_t largest = static_cast<std::uint64_t>(std::numeric_limits<Integer>::max()) + (number.mIsNegative ? 1 : 0);
+	std::uint64_t magnitude = 0;
 	for (const UTF16Char digit : number.mText.substr(0, digits))
 	{
-		const Wide value = digit - Wide{'0'};
+		const std::uint64_t value = digit - std::uint64_t{'0'};
 		if (magnitude > (largest - value) / 10)
 			return false;
 		magnitude = magnitude * 10 + value;
@@ -131,95 +130,146 @@ std::size_t DecimalLength(UTF16StringView inText)
 	return digits == 0 ? length : inText.size() - exponent.size() + digits;
 }
 
-// Whether a decimal number that no double holds is too large, and not too small, for one.
-bool IsHuge(std::string_view inText)
+// The number behind an exponent's mark; one that is far beyond every text's length and every double is cut short.
+std::int64_t ReadExponent(UTF16StringView inText)
 {
-	// A double holds every power of ten that a number whose exponent is out of range could be off by, so the place of
-	// the first digit other than 0 decides: text lengths are far below the exponents that matter, unless both are absurd.
-	const std::size_t mark = inText.find_first_of("eE");
-	const std::string_view digits = inText.substr(0, mark);
-	const std::size_t point = std::min(digits.find('.'), digits.size());
-	const std::size_t first = digits.find_first_of("123456789");
-	if (first == std::string_view::npos)
-		return false;
-	const double place = first < point ? static_cast<double>(point - first) : -static_cast<double>(first - point);
-	if (mark == std::string_view::npos)
-		return place > 0;
-	const bool isNegative = inText[mark + 1] == '-';
-	const std::size_t begin = inText.find_first_of("123456789", mark);
-	double exponent = 0;
-	for (const char digit : begin == std::string_view::npos ? std::string_view() : inText.substr(begin))
-		exponent = exponent * 10 + (digit - '0');
-	return place + (isNegative ? -exponent : exponent) > 0;
+	constexpr std::int64_t kMost = 4'000'000'000'000'000'000;
+	const bool isNegative = TakeSign(inText);
+	std::int64_t magnitude = 0;
+	for (const UTF16Char digit : inText)
+		magnitude = std::min(kMost, std::min(magnitude, kMost / 10) * 10 + (digit - '0'));
+	return isNegative ? -magnitude : magnitude;
+}
+
+// A number as "." with digits, the first of them not 0, for the library to read: no text makes it longer.
+class SignificantDigits
+{
+public:
+	explicit SignificantDigits(UTF16StringView inDigits)
+	{
+		*mEnd++ = '.';
+		for (const UTF16Char digit : inDigits)
+			if (IsDigit(digit))
+				Append(static_cast<char>(digit));
+	}
+
+	// This, times ten to the power of inExponent; infinite or zero when out of range.
+	double Scaled(std::int64_t inExponent)
+	{
+		constexpr std::int64_t kHuge = 400;   // beyond every double by far
+		double value = 0;
+		if (inExponent > kHuge)   return std::numeric_limits<double>::infinity();
+		if (inExponent < -kHuge)  return 0;
+		*mEnd = 'e';
+		const auto exponent = std::to_chars(mEnd + 1, mBuffer.data() + mBuffer.size(), inExponent);
+		const auto result = std::from_chars(mBuffer.data(), exponent.ptr, value);
+		if (result.ec == std::errc::result_out_of_range)
+			return inExponent > 0 ? std::numeric_limits<double>::infinity() : 0;
+		return value;
+	}
+
+private:
+	// A double, and the middle between two of them, has at most 768 digits: of those that follow it only matters whether
+	// one is not 0, which a single last digit says.
+	static constexpr std::ptrdiff_t kMostDigits = 770;
+
+	void Append(char inDigit)
+	{
+		if (mEnd - mBuffer.data() <= kMostDigits)
+			*mEnd++ = inDigit;
+		else if (inDigit != '0')
+			mEnd[-1] = '1';
+	}
+
+	std::array<char, kMostDigits + 8> mBuffer;   // "." and "e-400" included
+	char* mEnd = mBuffer.data();
+};
+
+// The value of a decimal number as DecimalLength finds it.
+double ReadDecimal(UTF16StringView inText)
+{
+	const auto isMark = [](UTF16Char inChar) { return (inChar | 0x20) == 'e'; };
+	const auto isSignificant = [](UTF16Char inChar) { return inChar >= '1' && inChar <= '9'; };
+	const auto mark = std::ranges::find_if(inText, isMark);
+	const auto point = std::find(inText.begin(), mark, UTF16Char{'.'});
+	const auto first = std::find_if(inText.begin(), mark, isSignificant);
+	if (first == mark)
+		return 0;
+	const std::int64_t place = first < point ? point - first : point - first + 1;
+	const std::int64_t exponent = mark == inText.end() ? 0 : ReadExponent({mark + 1, inText.end()});
+	return SignificantDigits({first, mark}).Scaled(place + exponent);
 }
 
 // ---- Fractions -------------------------------------------------------------------------------------------------------
 
-constexpr int kLargestTerm = 2'147'483'646;
+constexpr std::int64_t kLargestTerm = 2'147'483'646;
 
-using Wide = boost::multiprecision::number<boost::multiprecision::cpp_int_backend<512, 512,
-	boost::multiprecision::signed_magnitude, boost::multiprecision::unchecked, void>>;
+__extension__ typedef unsigned __int128 Wide;   // NOLINT(modernize-use-using): an alias declaration takes no __extension__
 
-struct Fraction
+// The value to come near to, exactly.
+struct Target
 {
 	Wide mNumerator;
 	Wide mDenominator;
 };
 
-// A positive double as an exact fraction, for magnitudes from 2^-33 to 2^31.
-Fraction ExactFraction(double inMagnitude)
+struct Fraction
+{
+	std::int64_t mNumerator;     // [0, kLargestTerm]
+	std::int64_t mDenominator;   // [0, kLargestTerm]
+};
+
+// For magnitudes in [2^-33, 2^31): the numerator is below 2^53, the denominator at most 2^86.
+Target ExactTarget(double inMagnitude)
 {
 	constexpr int kMantissaBits = 53;
 	int exponent = 0;
 	const double mantissa = std::frexp(inMagnitude, &exponent);
-	Fraction fraction{static_cast<std::int64_t>(std::ldexp(mantissa, kMantissaBits)), 1};
-	const int shift = exponent - kMantissaBits;
-	if (shift >= 0)
-		fraction.mNumerator <<= shift;
-	else
-		fraction.mDenominator <<= -shift;
-	return fraction;
+	return {static_cast<Wide>(std::ldexp(mantissa, kMantissaBits)), Wide{1} << (kMantissaBits - exponent)};
 }
 
-// |inTarget - inFraction| x both denominators, so that distances to one target compare after a cross-multiplication.
-Wide ScaledDistance(const Fraction& inTarget, const Fraction& inFraction)
+// The closer of two neighbours on both sides of inTarget, then that with the smaller denominator, then that nearer to
+// zero. inTarget is compared with the middle between them; no product exceeds 2^117, the middle being at most twice it.
+Fraction Closer(const Target& inTarget, const Fraction& inA, const Fraction& inB)
 {
-	return abs(inTarget.mNumerator * inFraction.mDenominator - inFraction.mNumerator * inTarget.mDenominator);
-}
-
-// The better of two neighbours: the closer one, then that with the smaller denominator, then that nearer to zero.
-const Fraction& Closer(const Fraction& inTarget, const Fraction& inA, const Fraction& inB)
-{
-	const Wide a = ScaledDistance(inTarget, inA) * inB.mDenominator;
-	const Wide b = ScaledDistance(inTarget, inB) * inA.mDenominator;
-	if (a != b)
-		return a < b ? inA : inB;
+	const std::int64_t a = inA.mNumerator * inB.mDenominator;
+	const std::int64_t b = inB.mNumerator * inA.mDenominator;
+	const Wide target = inTarget.mNumerator * static_cast<Wide>(2 * inA.mDenominator * inB.mDenominator);
+	const Wide middle = inTarget.mDenominator * static_cast<Wide>(a + b);
+	if (target != middle)
+		return (target < middle) == (a < b) ? inA : inB;
 	if (inA.mDenominator != inB.mDenominator)
 		return inA.mDenominator < inB.mDenominator ? inA : inB;
 	return inA.mNumerator < inB.mNumerator ? inA : inB;
 }
 
+// How often inLast can be added to inBefore, term by term, before a term is too large.
+std::int64_t MostSteps(const Fraction& inBefore, const Fraction& inLast)
+{
+	const auto steps = [](std::int64_t inStart, std::int64_t inStep)
+	{ return inStep == 0 ? kLargestTerm : (kLargestTerm - inStart) / inStep; };
+	return std::min(steps(inBefore.mNumerator, inLast.mNumerator), steps(inBefore.mDenominator, inLast.mDenominator));
+}
+
 // The closest fraction with terms up to kLargestTerm. Convergents approach the target from both sides in turn; the best
 // fraction is the last convergent that fits or the last semiconvergent that fits on the way to the next one.
-Fraction ClosestFraction(const Fraction& inTarget)
+Fraction ClosestFraction(const Target& inTarget)
 {
 	Fraction before{0, 1};
 	Fraction last{1, 0};
-	Fraction rest = inTarget;
+	Target rest = inTarget;
 	while (rest.mDenominator != 0)
 	{
 		const Wide quotient = rest.mNumerator / rest.mDenominator;
-		Wide fitting = quotient;
-		if (last.mNumerator != 0)
-			fitting = std::min<Wide>(fitting, (kLargestTerm - before.mNumerator) / last.mNumerator);
-		if (last.mDenominator != 0)
-			fitting = std::min<Wide>(fitting, (kLargestTerm - before.mDenominator) / last.mDenominator);
+		const std::int64_t steps = MostSteps(before, last);
+		const bool fits = quotient <= static_cast<Wide>(steps);
+		const std::int64_t count = fits ? static_cast<std::int64_t>(quotient) : steps;
 		const Fraction next{
-			before.mNumerator + fitting * last.mNumerator, before.mDenominator + fitting * last.mDenominator};
-		if (fitting < quotient)
-			return next.mDenominator == 0 ? last : last.mDenominator == 0 ? next : Closer(inTarget, last, next);
+			before.mNumerator + count * last.mNumerator, before.mDenominator + count * last.mDenominator};
+		if (!fits)
+			return Closer(inTarget, last, next);
 		before = std::exchange(last, next);
-		rest = {rest.mDenominator, rest.mNumerator - quotient * rest.mDenominator};
+		rest = {rest.mDenominator, rest.mNumerator % rest.mDenominator};
 	}
 	return last;
 }
@@ -234,26 +284,26 @@ UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, uns
 	if (std::isinf(inValue))
 		return AsciiToUTF16(inValue < 0 ? "-inf" : "inf");
 
-	std::string text = FixedText(std::abs(inValue), inDecimals);
+	std::array<char, kLongestFixedText> buffer;
+	const std::string_view fixed = FixedText(std::abs(inValue), inDecimals, buffer);
 	const bool keepsZeros = !inFlags.Test(kNumberFlag_DropTrailingZeros);
-	const bool isNegative = inValue < 0 && text.find_first_not_of("0.") != std::string::npos;
-	const unsigned long moreDecimals = keepsZeros && inDecimals > kMostDecimals ? inDecimals - kMostDecimals : 0;
-	if (!keepsZeros)
-		DropTrailingZeros(text);
-	const std::size_t integerDigits = std::min(text.find('.'), text.size());
+	const std::string_view digits = keepsZeros ? fixed : WithoutTrailingZeros(fixed);
+	const bool isNegative = inValue < 0 && digits.find_first_not_of("0.") != std::string_view::npos;
+	const std::size_t integerDigits = std::min(digits.find('.'), digits.size());
 	const unsigned long moreDigits = inMinIntegerDigits > integerDigits ? inMinIntegerDigits - integerDigits : 0;
+	const unsigned long moreDecimals = keepsZeros && inDecimals > kMostDecimals ? inDecimals - kMostDecimals : 0;
 
 	// Compared piece by piece: the counts come from the caller and their sum could wrap.
 	const std::size_t maxLength = inMaxLength < 0 ? 0 : static_cast<std::size_t>(inMaxLength);
-	const std::size_t length = text.size() + (isNegative ? 1 : 0);
+	const std::size_t length = digits.size() + (isNegative ? 1 : 0);
 	if (length > maxLength || moreDecimals > maxLength - length || moreDigits > maxLength - length - moreDecimals)
-		return AsciiToUTF16(GeneralText(inValue));
+		return GeneralText(inValue);
 
-	text.insert(0, moreDigits, '0');
-	text.append(moreDecimals, '0');
+	UTF16String text(length + moreDecimals + moreDigits, '0');
 	if (isNegative)
-		text.insert(0, 1, '-');
-	return AsciiToUTF16(text);
+		text.front() = '-';
+	std::ranges::copy(digits, text.begin() + static_cast<std::ptrdiff_t>((isNegative ? 1 : 0) + moreDigits));
+	return text;
 }
 
 bool StringToNumber(UTF16StringView inText, int& outValue, unsigned /*inOptions*/)
@@ -273,11 +323,7 @@ bool StringToNumber(UTF16StringView inText, double& outValue, unsigned /*inOptio
 	const std::size_t length = DecimalLength(number.mText);
 	if (length == 0)
 		return false;
-	const std::string text(number.mText.begin(), number.mText.begin() + static_cast<std::ptrdiff_t>(length));
-	double magnitude = 0;
-	const auto result = std::from_chars(text.data(), text.data() + text.size(), magnitude);
-	if (result.ec == std::errc::result_out_of_range)
-		magnitude = IsHuge(text) ? std::numeric_limits<double>::infinity() : 0;
+	const double magnitude = ReadDecimal(number.mText.substr(0, length));
 	outValue = number.mIsNegative ? -magnitude : magnitude;
 	return true;
 }
@@ -289,9 +335,9 @@ boost::rational<int> RationalApproximation(double inValue)
 	const int sign = inValue < 0 ? -1 : 1;
 	if (std::isnan(inValue) || magnitude < kNothing)
 		return {0, 1};
-	if (magnitude >= kLargestTerm)
-		return {sign * kLargestTerm, 1};
-	const Fraction closest = ClosestFraction(ExactFraction(magnitude));
+	if (magnitude >= static_cast<double>(kLargestTerm))
+		return {sign * static_cast<int>(kLargestTerm), 1};
+	const Fraction closest = ClosestFraction(ExactTarget(magnitude));
 	return {sign * static_cast<int>(closest.mNumerator), static_cast<int>(closest.mDenominator)};
 }
 
