@@ -21,8 +21,9 @@ using ContractDialog
 using AssertDialog = std::function<bool(std::atomic<bool>& ioDisabled, const char* inCondition, const char* inMessage,
 	const char* inFile, int inLine, const char* inFunction)>;
 
-/// Installs a dialog and returns the one before it; an empty one stands for the default. Any thread may call them while
-/// others report.
+/// Installs a dialog and returns a copy of the one before it; an empty one stands for the default. Any thread may call
+/// them while others report: a report that has begun ends with the dialog it began with. Dialogs are called with no lock
+/// held, from any thread and by several at once; what they throw reaches the code that reports.
 ZONCORE_API ContractDialog SetContractDialog(ContractDialog inDialog);
 ZONCORE_API AssertDialog SetAssertDialog(AssertDialog inDialog);
 
@@ -35,7 +36,8 @@ ZONCORE_API bool BreakAfterContractDialog(
 ZONCORE_API bool BreakAfterAssertDialog(std::atomic<bool>& ioDisabled, const char* inCondition, const char* inMessage,
 	const char* inFile, int inLine, const char* inFunction, bool inMayDisable);
 
-/// Whether a debugger is attached to this process, as the operating system says now; false where it cannot tell.
+/// Whether a debugger is attached to this process, as the operating system says now; false where it cannot tell. Costs
+/// the reading of a short file.
 ZONCORE_API bool IsDebuggerAttached() noexcept;
 
 /// Stops in the attached debugger; without one the process ends.

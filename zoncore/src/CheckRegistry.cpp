@@ -2,6 +2,9 @@
 
 #include <algorithm>
 #include <exception>
+#include <iterator>
+#include <set>
+#include <utility>
 
 namespace zoncore
 {
@@ -37,37 +40,40 @@ CheckRegistry& CheckRegistry::Get()
 void CheckRegistry::Register(std::string_view inSuite, std::string_view inCheck, Check inCheckFunction)
 {
 	const std::lock_guard lock(mMutex);
-	std::vector<NamedCheck>& checks = mSuites.try_emplace(std::string(inSuite)).first->second;
-	const auto found = std::ranges::find(checks, inCheck, &NamedCheck::first);
-	if (found == checks.end())
-		checks.emplace_back(inCheck, std::move(inCheckFunction));
+	const auto found = std::ranges::find_if(
+		mEntries, [&](const Entry& inEntry) { return inEntry.mSuite == inSuite && inEntry.mName == inCheck; });
+	if (found == mEntries.end())
+		mEntries.push_back({std::string(inSuite), std::string(inCheck), std::move(inCheckFunction)});
 	else
-		found->second = std::move(inCheckFunction);
+		found->mCheck.swap(inCheckFunction);   // the one that was there ends with the call, without the lock
 }
 
 std::vector<std::string> CheckRegistry::GetSuites() const
 {
-	const std::lock_guard lock(mMutex);
-	std::vector<std::string> suites;
-	for (const auto& [suite, checks] : mSuites)
-		suites.push_back(suite);
-	return suites;
+	std::set<std::string> suites;
+	{
+		const std::lock_guard lock(mMutex);
+		for (const Entry& entry : mEntries)
+			suites.insert(entry.mSuite);
+	}
+	return {suites.begin(), suites.end()};
 }
 
 bool CheckRegistry::Run(std::string_view inSuite, const Report& inReport) const
 {
-	std::vector<NamedCheck> checks;
+	std::vector<Entry> entries;
 	{
 		const std::lock_guard lock(mMutex);
-		if (const auto found = mSuites.find(inSuite); found != mSuites.end())
-			checks = found->second;
+		std::ranges::copy_if(mEntries, std::back_inserter(entries),
+			[&](const Entry& inEntry) { return inEntry.mSuite == inSuite; });
 	}
-	bool passed = !checks.empty();
-	for (const auto& [name, check] : checks)
+	bool passed = !entries.empty();
+	for (const Entry& entry : entries)
 	{
 		std::string message;
-		const bool checkPassed = RunCheck(check, message);
-		inReport(name, checkPassed, message);
+		const bool checkPassed = RunCheck(entry.mCheck, message);
+		if (inReport)
+			inReport(entry.mName, checkPassed, message);
 		passed = passed && checkPassed;
 	}
 	return passed;

@@ -2,9 +2,12 @@
 
 #include "zoncore/src/Hook.h"
 
+#include <algorithm>
+#include <array>
 #include <csignal>
+#include <cstdarg>
+#include <cstddef>
 #include <cstdio>
-#include <cstdlib>
 #include <fcntl.h>
 #include <string_view>
 #include <unistd.h>
@@ -18,20 +21,44 @@ namespace
 constinit Hook<bool(const char*, const char*, const char*, int)> sContractDialog;
 constinit Hook<bool(std::atomic<bool>&, const char*, const char*, const char*, int, const char*)> sAssertDialog;
 
+// Writes one line at once, so that lines of several threads do not mix. Line breaks inside become blanks, those at the
+// end go, and what is too long for anybody to read is cut off.
+[[gnu::format(printf, 1, 2)]] void PrintLine(const char* inFormat, ...)
+{
+	constexpr int kLongestLine = 1'000;
+	std::array<char, kLongestLine + 2> line{};   // and a line break and the end
+	std::va_list arguments;
+	va_start(arguments, inFormat);
+	const int length = std::vsnprintf(line.data(), kLongestLine + 1, inFormat, arguments);
+	va_end(arguments);
+	if (length < 0)
+		return;
+	auto end = line.begin() + std::min(length, kLongestLine);
+	while (end != line.begin() && end[-1] == '\n')
+		--end;
+	std::replace(line.begin(), end, '\n', ' ');
+	end[0] = '\n';
+	end[1] = '\0';
+	std::fputs(line.data(), stderr);
+}
+
+const char* OrUnknown(const char* inText)
+{
+	return inText != nullptr ? inText : "?";
+}
+
 bool PrintContract(const char* inCondition, const char* inSourcePath, const char* inSignature, int inLine)
 {
-	std::fprintf(stderr, "%s:%d: contract violated: %s in %s\n", inSourcePath, inLine, inCondition, inSignature);
+	PrintLine("%s:%d: contract violated: %s in %s", OrUnknown(inSourcePath), inLine, OrUnknown(inCondition),
+		OrUnknown(inSignature));
 	return false;
 }
 
-// A message may end in a line break of its own; the report stays one line.
 bool PrintAssert(
-	const char* inCondition, std::string_view inMessage, const char* inFile, int inLine, const char* inFunction)
+	const char* inCondition, const char* inMessage, const char* inFile, int inLine, const char* inFunction)
 {
-	while (!inMessage.empty() && inMessage.back() == '\n')
-		inMessage.remove_suffix(1);
-	std::fprintf(stderr, "%s:%d: assertion failed: %s: %.*s in %s\n", inFile, inLine, inCondition,
-		static_cast<int>(inMessage.size()), inMessage.data(), inFunction);
+	PrintLine("%s:%d: assertion failed: %s in %s: %s", OrUnknown(inFile), inLine, OrUnknown(inCondition),
+		OrUnknown(inFunction), OrUnknown(inMessage));
 	return false;
 }
 
@@ -77,7 +104,7 @@ bool IsDebuggerAttached() noexcept
 	if (size <= 0)
 		return false;
 	const std::string_view status(buffer, static_cast<std::size_t>(size));
-	constexpr std::string_view kTracer = "TracerPid:\t";
+	constexpr std::string_view kTracer = "\nTracerPid:\t";
 	const auto found = status.find(kTracer);
 	return found != std::string_view::npos && found + kTracer.size() < status.size()
 		&& status[found + kTracer.size()] != '0';

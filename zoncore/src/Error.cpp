@@ -3,6 +3,7 @@
 #include "zoncore/src/Hook.h"
 #include "zoncore/src/TextKey.h"
 
+#include <string>
 #include <utility>
 
 namespace zoncore::config
@@ -12,10 +13,15 @@ namespace
 
 constinit Hook<void(int, const char*, const std::vector<ReplacementValue>&)> sReporter;
 
+const char* OrEmpty(const char* inText)
+{
+	return inText != nullptr ? inText : "";
+}
+
 }   // namespace
 
 Error::Error(int inLevel, const char* inKey)
-	: std::runtime_error(std::string(EnglishText(inKey))), mLevel(inLevel), mKey(inKey)
+	: std::runtime_error(std::string(EnglishText(OrEmpty(inKey)))), mLevel(inLevel), mKey(OrEmpty(inKey))
 {
 }
 

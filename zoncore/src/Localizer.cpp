@@ -1,13 +1,11 @@
 #include "zoncore/Localizer.h"
 
-#include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/src/Hook.h"
 #include "zoncore/src/TextKey.h"
 
+#include <algorithm>
 #include <cstddef>
-#include <memory>
-#include <mutex>
 #include <utility>
 
 namespace zoncore
@@ -15,40 +13,31 @@ namespace zoncore
 namespace
 {
 
-// Where texts come from besides the keys themselves.
-struct Sources
-{
-	config::Translator mTranslator;
-	std::shared_ptr<const config::MessageCatalogue> mCatalogue;
-};
-
-constinit Replaceable<Sources> sSources;
-constinit std::mutex sChangeMutex;   // one change at a time; look-ups do not take it
-
-// Replaces the sources by a copy that inChange has changed.
-template <class Change>
-void ChangeSources(Change inChange)
-{
-	std::shared_ptr<const Sources> before;   // given up after the lock: what it holds is the host's
-	const std::lock_guard lock(sChangeMutex);
-	before = sSources.Get();
-	Sources next = before ? *before : Sources();
-	inChange(next);
-	const bool isEmpty = !next.mTranslator && !next.mCatalogue;
-	sSources.Exchange(isEmpty ? nullptr : std::make_shared<const Sources>(std::move(next)));
-}
+constinit Hook<bool(std::string_view, UTF16String&)> sTranslator;
 
 // Whether the host's translator gave a text for inKey.
-bool Translate(const config::Translator& inTranslator, std::string_view inKey, UTF16String& outText)
+bool Translate(std::string_view inKey, UTF16String& outText)
 {
+	const auto translator = sTranslator.Get();
+	if (!translator)
+		return false;
 	try
 	{
-		return inTranslator && inTranslator(inKey, outText);
+		return (*translator)(inKey, outText);
 	}
 	catch (...)
 	{
 		return false;   // display text is no reason for an operation to fail
 	}
+}
+
+constexpr UTF16Char kPlaceholderMark = '@';
+
+// Which replacement the mark at the start of inText asks for; past the end of any list when no digit follows it.
+std::size_t PlaceholderIndex(UTF16StringView inText)
+{
+	const bool hasDigit = inText.size() > 1 && inText[1] >= '0' && inText[1] <= '9';
+	return hasDigit ? static_cast<std::size_t>(inText[1] - '0') : UTF16StringView::npos;
 }
 
 }   // namespace
@@ -61,42 +50,32 @@ config::Localizer& config::Localizer::Get() noexcept
 
 UTF16String config::Localizer::Lookup(std::string_view inKey) const
 {
-	const auto sources = sSources.Get();
-	if (!sources)
-		return utility::UTF8to16(EnglishText(inKey));
-	if (UTF16String text; Translate(sources->mTranslator, inKey, text))
+	UTF16String text;
+	if (Translate(inKey, text))
 		return text;
-	const std::string_view translation = sources->mCatalogue ? sources->mCatalogue->Find(inKey) : std::string_view();
-	return utility::UTF8to16(translation.empty() ? EnglishText(inKey) : translation);
+	return utility::UTF8to16(EnglishText(inKey));
 }
 
 void config::Localizer::SetTranslator(Translator inTranslator)
 {
-	ChangeSources([&](Sources& ioSources) { ioSources.mTranslator = std::move(inTranslator); });
-}
-
-void config::Localizer::SetCatalogue(std::shared_ptr<const MessageCatalogue> inCatalogue)
-{
-	ChangeSources([&](Sources& ioSources) { ioSources.mCatalogue = std::move(inCatalogue); });
+	sTranslator.Set(std::move(inTranslator));
 }
 
 UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements)
 {
 	UTF16String text;
-	for (std::size_t i = 0; i < inTemplate.size(); ++i)
+	text.reserve(inTemplate.size());
+	while (!inTemplate.empty())
 	{
-		const bool isMark
-			= inTemplate[i] == '@' && i + 1 < inTemplate.size() && inTemplate[i + 1] >= '0' && inTemplate[i + 1] <= '9';
-		const auto index = isMark ? static_cast<std::size_t>(inTemplate[i + 1] - '0') : inReplacements.size();
-		if (index < inReplacements.size())
-		{
-			text.append(inReplacements[index]);
-			++i;
-		}
-		else
-		{
-			text.push_back(inTemplate[i]);
-		}
+		const std::size_t plain = std::min(inTemplate.find(kPlaceholderMark), inTemplate.size());
+		text.append(inTemplate.substr(0, plain));
+		inTemplate.remove_prefix(plain);
+		if (inTemplate.empty())
+			break;
+		const std::size_t index = PlaceholderIndex(inTemplate);
+		const bool isFilled = index < inReplacements.size();
+		text.append(isFilled ? UTF16StringView(inReplacements[index]) : inTemplate.substr(0, 1));
+		inTemplate.remove_prefix(isFilled ? 2 : 1);
 	}
 	return text;
 }

@@ -18,9 +18,9 @@ namespace
 constexpr std::size_t kGranule = alignof(std::max_align_t);
 constexpr std::size_t kSizeClasses = 16;
 constexpr std::size_t kLargestPooled = kGranule * kSizeClasses;
-constexpr std::size_t kBatch = 32;               // blocks that travel between a thread and the depot at once
-constexpr std::size_t kMostKept = 4 * kBatch;    // blocks of one size that a thread keeps for itself
-constexpr std::size_t kChunkBytes = 64 * 1024;   // what the depot asks the system for
+constexpr std::size_t kBatch = 32;                  // blocks that travel between a thread and the depot at once
+constexpr std::size_t kMostKept = 4 * kBatch;       // blocks of one size that a thread keeps for itself
+constexpr std::size_t kChunkBytes = 64 * 1024;      // what the depot asks the system for
 
 struct Block
 {
@@ -112,7 +112,7 @@ enum class CacheState : std::uint8_t
 {
 	Unused,   // the thread has not disposed of anything yet: its end is not watched
 	Open,
-	Closed   // the thread is ending: its blocks go to the depot one by one
+	Closed    // the thread is ending: its blocks go to the depot one by one
 };
 
 struct ThreadCache
@@ -198,10 +198,10 @@ void* SmallBlockAllocator::Allocate(std::size_t inSize)
 	return ::operator new(inSize);
 }
 
-void SmallBlockAllocator::Dispose(void* inBlock, [[maybe_unused]] std::size_t inSize) noexcept
+// The size goes along: a checking `operator delete` finds blocks that come back with another one.
+void SmallBlockAllocator::Dispose(void* inBlock, std::size_t inSize) noexcept
 {
-	if (inBlock != nullptr)
-		::operator delete(inBlock);
+	::operator delete(inBlock, inSize);
 }
 
 #endif   // ZONCORE_SMALL_BLOCK_POOL
