@@ -28,8 +28,10 @@ static_assert(TruncateTo<std::int32_t>(2147483647.9) == INT_MAX && TruncateTo<st
 static_assert(TruncateTo<std::int32_t>(-2147483648.9) == INT_MIN && TruncateTo<std::int32_t>(-2147483649.0) == INT_MIN);
 static_assert(TruncateTo<std::int32_t>(-2147483647.9) == -INT_MAX && TruncateTo<std::int32_t>(-0.9) == 0);
 static_assert(TruncateTo<std::int64_t>(0x1p63) == LLONG_MIN && TruncateTo<std::int64_t>(-0x1p63) == LLONG_MIN);
-static_assert(TruncateTo<std::int64_t>(0x1.fffffffffffffp62) == LLONG_MAX - 1023 && TruncateTo<std::int64_t>(1e300) == LLONG_MIN);
-static_assert(TruncateTo<std::int64_t>(-0x1.fffffffffffffp62) == -LLONG_MAX + 1023 && TruncateTo<std::int64_t>(2.9) == 2);
+static_assert(
+	TruncateTo<std::int64_t>(0x1.fffffffffffffp62) == LLONG_MAX - 1023 && TruncateTo<std::int64_t>(1e300) == LLONG_MIN);
+static_assert(
+	TruncateTo<std::int64_t>(-0x1.fffffffffffffp62) == -LLONG_MAX + 1023 && TruncateTo<std::int64_t>(2.9) == 2);
 static_assert(TruncateTo<std::int64_t>(kNaN) == LLONG_MIN && TruncateTo<std::int32_t>(kInfinity) == INT_MIN);
 
 // Doubles of every magnitude: half of them any bit pattern, half of them near to what people write.
@@ -56,7 +58,8 @@ std::string Print(const char* inFormat, Arguments... inArguments)
 	return text;
 }
 
-std::string Format(double inValue, unsigned long inDigits, unsigned long inDecimals, unsigned short inFlags, int inLength)
+std::string Format(
+	double inValue, unsigned long inDigits, unsigned long inDecimals, unsigned short inFlags, int inLength)
 {
 	return UTF16to8(NumberToString(inValue, inDigits, inDecimals, inFlags, inLength));
 }
@@ -71,14 +74,15 @@ TEST(NumberToString, WritesFixedNotation)
 		unsigned short mFlags;
 	};
 	constexpr unsigned short kDrop = kNumberFlag_DropTrailingZeros;
-	for (const Case& each : std::initializer_list<Case>{
-			 {"25", 25, 1, 2, kDrop}, {"12.5", 12.5, 1, 2, kDrop}, {"29.97", 30'000 / 1'001.0, 1, 2, kDrop}, {"100", 100, 1, 0, kDrop},
-			 {"100", 100, 1, 3, kDrop}, {"0", 0, 1, 3, kDrop}, {"-0.5", -0.5, 1, 3, kDrop}, {"1.0", 1, 1, 1, 0},
-			 {"0.9091", 10 / 11.0, 1, 4, 0}, {"1.0000", 0.99999, 1, 4, 0}, {"0.12", 0.125, 1, 2, 0}, {"0.38", 0.375, 1, 2, 0},
-			 {"2", 2.5, 1, 0, 0}, {"4", 3.5, 1, 0, 0}, {"0", 0.5, 0, 0, 0}, {"1", 0.5000001, 1, 0, 0}, {"007.50", 7.5, 3, 2, 0},
+	for (const Case& each : std::initializer_list<Case>{{"25", 25, 1, 2, kDrop}, {"12.5", 12.5, 1, 2, kDrop},
+			 {"29.97", 30'000 / 1'001.0, 1, 2, kDrop}, {"100", 100, 1, 0, kDrop}, {"100", 100, 1, 3, kDrop},
+			 {"0", 0, 1, 3, kDrop}, {"-0.5", -0.5, 1, 3, kDrop}, {"1.0", 1, 1, 1, 0}, {"0.9091", 10 / 11.0, 1, 4, 0},
+			 {"1.0000", 0.99999, 1, 4, 0}, {"0.12", 0.125, 1, 2, 0}, {"0.38", 0.375, 1, 2, 0}, {"2", 2.5, 1, 0, 0},
+			 {"4", 3.5, 1, 0, 0}, {"0", 0.5, 0, 0, 0}, {"1", 0.5000001, 1, 0, 0}, {"007.50", 7.5, 3, 2, 0},
 			 {"-007.5", -7.5, 3, 2, kDrop}, {"123", 123, 2, 0, 0}, {"0.00", -0.001, 1, 2, 0}, {"0", -0.0, 1, 2, kDrop},
 			 {"-0.01", -0.005000001, 1, 2, 0}, {"000", -0.4, 3, 0, 0}, {"1.0", 1, 1, 1, 0xFFFB}, {"1", 1, 1, 1, 0xFFFF},
-			 {"inf", kInfinity, 5, 2, 0}, {"-inf", -kInfinity, 5, 2, kDrop}, {"nan", kNaN, 5, 2, 0}, {"nan", -kNaN, 1, 1, 0}})
+			 {"inf", kInfinity, 5, 2, 0}, {"-inf", -kInfinity, 5, 2, kDrop}, {"nan", kNaN, 5, 2, 0},
+			 {"nan", -kNaN, 1, 1, 0}})
 		EXPECT_EQ(Format(each.mValue, each.mDigits, each.mDecimals, each.mFlags, 31), each.mExpected);
 }
 
@@ -135,7 +139,10 @@ TEST(StringToNumber, ReadsIntegers)
 {
 	for (const char* const text : {"12", "+12", " \t\n\v\f\r12", "12x", "0012", "12.9", "12 3", "12e3", "12-"})
 		EXPECT_EQ(Read<int>(text) + "," + Read<long long>(text), "12,12") << text;
-	for (const char* const text : {"", " ", "x12", "-", "+", "+-12", "--12", "- 12", ".5", "\xA0" "12", "e1"})
+	for (const char* const text : {"", " ", "x12", "-", "+", "+-12", "--12", "- 12", ".5",
+			 "\xA0"
+			 "12",
+			 "e1"})
 		EXPECT_EQ(Read<int>(text) + "," + Read<long long>(text), "0 rejected,0 rejected") << text;
 	EXPECT_EQ(Read<int>("2147483647"), "2147483647");
 	EXPECT_EQ(Read<int>("-2147483648"), "-2147483648");
@@ -159,24 +166,27 @@ void ExpectDouble(const std::string& inText, std::size_t inLength = std::string:
 {
 	double value = 99;
 	ASSERT_TRUE(StringToNumber(AsciiToUTF16(inText), value, 0)) << inText;
-	ASSERT_EQ(std::bit_cast<std::uint64_t>(value), std::bit_cast<std::uint64_t>(std::strtod(inText.substr(0, inLength).c_str(), nullptr)))
+	ASSERT_EQ(std::bit_cast<std::uint64_t>(value),
+		std::bit_cast<std::uint64_t>(std::strtod(inText.substr(0, inLength).c_str(), nullptr)))
 		<< inText.substr(0, 100) << " is not " << value;
 }
 
 TEST(StringToNumber, ReadsDoubles)
 {
-	for (const char* const text : {"1", "-1.5", "+.5", "5.", "-0", "0.0", "1e3", "1E+3", "1.25e-3", "  7", "00012.500", "1e999",
-			 "-1e999", "1e-999", "-1e-999", "0e999", "1e99999999999999999999", "1e-99999999999999999999", "0e99999999999999999999",
-			 "4.9406564584124654e-324", "2.4703282292062327208e-324", "2.4703282292062328e-324", "2.2250738585072011e-308",
-			 "1.7976931348623157e308", "1.7976931348623159e308", "9007199254740993", "9007199254740993.0000001", "1e00000000000005"})
+	for (const char* const text : {"1", "-1.5", "+.5", "5.", "-0", "0.0", "1e3", "1E+3", "1.25e-3", "  7", "00012.500",
+			 "1e999", "-1e999", "1e-999", "-1e-999", "0e999", "1e99999999999999999999", "1e-99999999999999999999",
+			 "0e99999999999999999999", "4.9406564584124654e-324", "2.4703282292062327208e-324",
+			 "2.4703282292062328e-324", "2.2250738585072011e-308", "1.7976931348623157e308", "1.7976931348623159e308",
+			 "9007199254740993", "9007199254740993.0000001", "1e00000000000005"})
 		ExpectDouble(text);
 	struct Prefix
 	{
 		const char* mText;
 		std::size_t mLength;
 	};
-	for (const auto& [text, length] : std::initializer_list<Prefix>{{"1.5.2", 3}, {"1,5", 1}, {"1e", 1}, {"1e+", 1}, {"1e-x", 1},
-			 {"1.e5", 4}, {"0x10", 1}, {"1d5", 1}, {"7 8", 1}, {"1.5f", 3}, {"2e1.5", 3}, {"1-2", 1}, {"3_000", 1}})
+	for (const auto& [text, length] :
+		std::initializer_list<Prefix>{{"1.5.2", 3}, {"1,5", 1}, {"1e", 1}, {"1e+", 1}, {"1e-x", 1}, {"1.e5", 4},
+			{"0x10", 1}, {"1d5", 1}, {"7 8", 1}, {"1.5f", 3}, {"2e1.5", 3}, {"1-2", 1}, {"3_000", 1}})
 		ExpectDouble(text, length);
 	for (const char* const text : {"", ".", "-.", "e5", ".e5", "-e5", "inf", "nan", "- 1", "--1", "x"})
 	{
@@ -196,7 +206,8 @@ TEST(StringToNumber, RoundsTextOfAnyLengthCorrectly)
 			continue;
 		ExpectDouble(Print("%.17g", value));
 		// Exactly between two doubles, and a little above: a digit far behind decides.
-		const boost::multiprecision::cpp_int mantissa(static_cast<std::uint64_t>(std::ldexp(0.5 + value / (1 + value) / 2, 53)) * 2 + 1);
+		const boost::multiprecision::cpp_int mantissa(
+			static_cast<std::uint64_t>(std::ldexp(0.5 + value / (1 + value) / 2, 53)) * 2 + 1);
 		const std::string middle = boost::multiprecision::cpp_int(mantissa << (i % 300)).str();
 		ExpectDouble(middle);
 		ExpectDouble(middle + "." + std::string(static_cast<std::size_t>(i % 2'000), '0') + "1");
@@ -255,11 +266,12 @@ TEST(RationalApproximation, GivesTheClosestFraction)
 		double mValue;
 		const char* mExpected;
 	};
-	for (const Case& each : std::initializer_list<Case>{{0, "0/1"}, {-0.0, "0/1"}, {1, "1/1"}, {-2.5, "-5/2"}, {29.97, "2997/100"},
-			 {1 / 3.0, "1/3"}, {kNaN, "0/1"}, {kInfinity, "2147483646/1"}, {-kInfinity, "-2147483646/1"}, {1e300, "2147483646/1"},
-			 {2147483646.0, "2147483646/1"}, {-2147483648.0, "-2147483646/1"}, {2147483645.75, "2147483646/1"},
-			 {1 / 2147483646.0, "1/2147483646"}, {2.34e-10, "1/2147483646"}, {2.32e-10, "0/1"}, {-1e-300, "0/1"}, {0x1p-1074, "0/1"},
-			 {0x1p-33, "0/1"}, {1 - 0x1p-53, "1/1"}, {0x1p30 + 0.25, "1073741824/1"},
+	for (const Case& each : std::initializer_list<Case>{{0, "0/1"}, {-0.0, "0/1"}, {1, "1/1"}, {-2.5, "-5/2"},
+			 {29.97, "2997/100"}, {1 / 3.0, "1/3"}, {kNaN, "0/1"}, {kInfinity, "2147483646/1"},
+			 {-kInfinity, "-2147483646/1"}, {1e300, "2147483646/1"}, {2147483646.0, "2147483646/1"},
+			 {-2147483648.0, "-2147483646/1"}, {2147483645.75, "2147483646/1"}, {1 / 2147483646.0, "1/2147483646"},
+			 {2.34e-10, "1/2147483646"}, {2.32e-10, "0/1"}, {-1e-300, "0/1"}, {0x1p-1074, "0/1"}, {0x1p-33, "0/1"},
+			 {1 - 0x1p-53, "1/1"}, {0x1p30 + 0.25, "1073741824/1"},
 			 // Ties: the smaller denominator, then the one nearer to zero.
 			 {800'000'000.25, "800000000/1"}, {800'000'000.75, "800000001/1"}, {-800'000'000.25, "-800000000/1"},
 			 {1'073'741'823.5, "1073741823/1"}, {-1'073'741'823.5, "-1073741823/1"}, {2147483645.5, "2147483645/1"}})
@@ -289,7 +301,8 @@ std::string ApproximateStepwise(double inValue)
 		(side < 0 ? highTop : lowTop) = top;
 		(side < 0 ? highBottom : lowBottom) = bottom;
 	}
-	const bool takesLow = highBottom == 0 || exact - cpp_rational(lowTop, lowBottom) <= cpp_rational(highTop, highBottom) - exact;
+	const bool takesLow
+		= highBottom == 0 || exact - cpp_rational(lowTop, lowBottom) <= cpp_rational(highTop, highBottom) - exact;
 	return takesLow ? std::to_string(lowTop) + "/" + std::to_string(lowBottom)
 					: std::to_string(highTop) + "/" + std::to_string(highBottom);
 }

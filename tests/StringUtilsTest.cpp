@@ -88,7 +88,8 @@ TEST(UTF8, IllFormedPiecesAreMaximalSubparts)
 		// Tables 3-8 to 3-11 of the Unicode Standard, "Conformance", U+FFFD substitution.
 		{"\xC0\xAF\xE0\x80\xBF\xF0\x81\x82\x41", UTF16String(8, 0xFFFD) + Units({0x41})},
 		{"\xED\xA0\x80\xED\xBF\xBF\xED\xAF\x41", UTF16String(8, 0xFFFD) + Units({0x41})},
-		{"\xF4\x91\x92\x93\xFF\x41\x80\xBF\x42", Units({0xFFFD, 0xFFFD, 0xFFFD, 0xFFFD, 0xFFFD, 0x41, 0xFFFD, 0xFFFD, 0x42})},
+		{"\xF4\x91\x92\x93\xFF\x41\x80\xBF\x42",
+			Units({0xFFFD, 0xFFFD, 0xFFFD, 0xFFFD, 0xFFFD, 0x41, 0xFFFD, 0xFFFD, 0x42})},
 		{"\xE1\x80\xE2\xF0\x91\x92\xF1\xBF\x41", Units({0xFFFD, 0xFFFD, 0xFFFD, 0xFFFD, 0x41})},
 		// The example of its chapter 5.22.
 		{"\x61\xF1\x80\x80\xE1\x80\xC2\x62\x80\x63\x80\xBF\x64",
@@ -118,7 +119,8 @@ TEST(UTF16, LoneSurrogatesAreReplacedOneByOne)
 TEST(Ascii, BytesAbove7FAreReplaced)
 {
 	for (unsigned byte = 0; byte <= 0xFF; ++byte)
-		EXPECT_EQ(AsciiToUTF16(std::string(3, static_cast<char>(byte))), UTF16String(3, byte < 0x80 ? static_cast<UTF16Char>(byte) : 0xFFFD));
+		EXPECT_EQ(AsciiToUTF16(std::string(3, static_cast<char>(byte))),
+			UTF16String(3, byte < 0x80 ? static_cast<UTF16Char>(byte) : 0xFFFD));
 }
 
 TEST(Coercion, WritesAsAStreamDoes)

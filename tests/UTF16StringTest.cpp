@@ -41,19 +41,29 @@ auto Fill(const Stream&, char inChar)
 }
 
 // What the streams of both widths are told to write: the narrow one with the classic locale is the reference.
-const auto kWriters = std::make_tuple(
-	[](auto& ioStream) { ioStream << 0 << " " << -1 << " " << 1'234'567 << " " << 18'446'744'073'709'551'615u; },
+const auto kWriters = std::make_tuple([](auto& ioStream)
+	{ ioStream << 0 << " " << -1 << " " << 1'234'567 << " " << 18'446'744'073'709'551'615u; },
 	[](auto& ioStream) { ioStream << std::numeric_limits<long long>::min() << std::numeric_limits<int>::max(); },
-	[](auto& ioStream) { ioStream << 0.0 << " " << -0.0 << " " << 29.97 << " " << 1e6 << " " << 1234567.0 << " " << 1e-5; },
+	[](auto& ioStream)
+	{ ioStream << 0.0 << " " << -0.0 << " " << 29.97 << " " << 1e6 << " " << 1234567.0 << " " << 1e-5; },
 	[](auto& ioStream) { ioStream << std::fixed << std::setprecision(3) << 1234567.8905 << " " << 1e300; },
-	[](auto& ioStream) { ioStream << std::setprecision(17) << 0.1 << std::scientific << -1e-300 << std::hexfloat << 0.1; },
-	[](auto& ioStream) { ioStream << std::numeric_limits<double>::infinity() << std::numeric_limits<float>::quiet_NaN(); },
-	[](auto& ioStream) { ioStream << std::setw(6) << 42 << std::setw(6) << -4.5 << std::setw(3) << "abcd" << "x"; },
-	[](auto& ioStream) { ioStream << Fill(ioStream, '0') << std::setw(4) << -3 << std::internal << std::setw(4) << -3; },
-	[](auto& ioStream) { ioStream << std::left << Fill(ioStream, '*') << std::setw(6) << "ab" << std::setw(4) << 1 << "|"; },
+	[](auto& ioStream)
+	{ ioStream << std::setprecision(17) << 0.1 << std::scientific << -1e-300 << std::hexfloat << 0.1; },
+	[](auto& ioStream)
+	{ ioStream << std::numeric_limits<double>::infinity() << std::numeric_limits<float>::quiet_NaN(); },
+	[](auto& ioStream)
+	{
+		ioStream << std::setw(6) << 42 << std::setw(6) << -4.5 << std::setw(3) << "abcd"
+				 << "x";
+	},
+	[](auto& ioStream)
+	{ ioStream << Fill(ioStream, '0') << std::setw(4) << -3 << std::internal << std::setw(4) << -3; },
+	[](auto& ioStream)
+	{ ioStream << std::left << Fill(ioStream, '*') << std::setw(6) << "ab" << std::setw(4) << 1 << "|"; },
 	[](auto& ioStream) { ioStream << std::hex << std::showbase << std::uppercase << 48'879 << std::oct << 8; },
 	[](auto& ioStream) { ioStream << std::showpos << 1 << std::showpoint << 2.0 << std::boolalpha << true << false; },
-	[](auto& ioStream) { ioStream << "line" << std::endl << std::setw(3) << "c" << std::ends; });
+	[](auto& ioStream) { ioStream << "line" << std::endl
+								  << std::setw(3) << "c" << std::ends; });
 
 TEST_P(UTF16Stream, WritesWhatNarrowStreamsWrite)
 {
@@ -102,9 +112,11 @@ TEST_P(UTF16Stream, ReadsWhatNarrowStreamsRead)
 	{
 		std::istringstream narrow(inText);
 		narrow.imbue(std::locale::classic());
-		EXPECT_EQ(ReadAll<Value>(iUTF16StringStream(AsciiToUTF16(inText))), ReadAll<Value>(std::move(narrow))) << inText;
+		EXPECT_EQ(ReadAll<Value>(iUTF16StringStream(AsciiToUTF16(inText))), ReadAll<Value>(std::move(narrow)))
+			<< inText;
 	};
-	for (const char* const text : {"12 -7\t+3\n2147483647 2147483648", "1.234 5", "1,234", "x", "", "  ", "0x1F 017", "9e1"})
+	for (const char* const text :
+		{"12 -7\t+3\n2147483647 2147483648", "1.234 5", "1,234", "x", "", "  ", "0x1F 017", "9e1"})
 	{
 		compare(int{}, text);
 		compare(0ll, text);
@@ -146,7 +158,8 @@ TEST_P(UTF16Stream, KeepsItsFacetsWhenMovedSwappedAndCopied)
 	UTF16StringStream copied;
 	copied.copyfmt(second);
 	copied << std::setw(5) << 12'345 << std::endl;
-	EXPECT_EQ(UTF16to8(third.str()) + "|" + UTF16to8(second.str()) + "|" + UTF16to8(copied.str()), "1.5 1000 2.5|3.5|12345\n");
+	EXPECT_EQ(UTF16to8(third.str()) + "|" + UTF16to8(second.str()) + "|" + UTF16to8(copied.str()),
+		"1.5 1000 2.5|3.5|12345\n");
 }
 
 TEST_P(UTF16Stream, TakesTheModesOfStandardStreams)

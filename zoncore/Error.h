@@ -19,7 +19,8 @@ using ReplacementValue = UTF16String;
 /// Receives the level (0 for a violated contract), the key of the message (English text after "=") and the texts for its
 /// placeholders, which live as long as the call. It may throw, which the caller of the failing operation sees, or return,
 /// after which the operation proceeds unchecked. It is called with no lock held, from any thread and by several at once.
-using ErrorReporter = std::function<void(int inLevel, const char* inKey, const std::vector<ReplacementValue>& inValues)>;
+using ErrorReporter
+	= std::function<void(int inLevel, const char* inKey, const std::vector<ReplacementValue>& inValues)>;
 
 /// What the default reporter throws; what() is the English text of the key.
 class ZONCORE_API Error : public std::runtime_error

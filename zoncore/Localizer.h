@@ -63,8 +63,8 @@ public:
 	{
 	}
 
-	operator UTF16String() const& { return mText; }             // NOLINT(google-explicit-constructor): it is that text
-	operator UTF16String() && { return std::move(mText); }      // NOLINT(google-explicit-constructor)
+	operator UTF16String() const& { return mText; }          // NOLINT(google-explicit-constructor): it is that text
+	operator UTF16String() && { return std::move(mText); }   // NOLINT(google-explicit-constructor)
 
 private:
 	UTF16String mText;

@@ -29,8 +29,14 @@ ZONCORE_API UTF16String UTF8to16(std::string_view inText);
 
 /// UTF-16 text as UTF-8; each lone surrogate gives U+FFFD.
 ZONCORE_API std::string UTF16to8(UTF16StringView inText);
-inline std::string UTF16to8(const UTF16String& inText) { return UTF16to8(UTF16StringView(inText)); }
-inline std::string UTF16to8(const UTF16Char* inText) { return UTF16to8(UTF16StringView(inText)); }
+inline std::string UTF16to8(const UTF16String& inText)
+{
+	return UTF16to8(UTF16StringView(inText));
+}
+inline std::string UTF16to8(const UTF16Char* inText)
+{
+	return UTF16to8(UTF16StringView(inText));
+}
 
 /// Replaces every occurrence of inWhat in ioText by inWith, from the first to the last; what was put in is never searched
 /// again, so "aaa" with "aa" for "a" is "aaaaaa". An empty inWhat changes nothing. The arguments may be the same object.

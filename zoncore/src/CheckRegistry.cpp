@@ -64,8 +64,8 @@ bool CheckRegistry::Run(std::string_view inSuite, const Report& inReport) const
 	std::vector<Entry> entries;
 	{
 		const std::lock_guard lock(mMutex);
-		std::ranges::copy_if(mEntries, std::back_inserter(entries),
-			[&](const Entry& inEntry) { return inEntry.mSuite == inSuite; });
+		std::ranges::copy_if(
+			mEntries, std::back_inserter(entries), [&](const Entry& inEntry) { return inEntry.mSuite == inSuite; });
 	}
 	bool passed = !entries.empty();
 	for (const Entry& entry : entries)

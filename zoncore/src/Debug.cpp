@@ -54,8 +54,7 @@ bool PrintContract(const char* inCondition, const char* inSourcePath, const char
 	return false;
 }
 
-bool PrintAssert(
-	const char* inCondition, const char* inMessage, const char* inFile, int inLine, const char* inFunction)
+bool PrintAssert(const char* inCondition, const char* inMessage, const char* inFile, int inLine, const char* inFunction)
 {
 	PrintLine("%s:%d: assertion failed: %s in %s: %s", OrUnknown(inFile), inLine, OrUnknown(inCondition),
 		OrUnknown(inFunction), OrUnknown(inMessage));

@@ -22,7 +22,7 @@ namespace
 constexpr std::size_t kMostIntegerDigits = 309;   // of a finite double
 constexpr std::size_t kMostDecimals = 1'074;      // beyond these every double has zeros only
 constexpr std::size_t kLongestFixedText = kMostIntegerDigits + 1 + kMostDecimals;
-constexpr int kGeneralDigits = 6;                 // the precision of "%g"
+constexpr int kGeneralDigits = 6;   // the precision of "%g"
 
 UTF16String GeneralText(double inValue)
 {
@@ -37,8 +37,7 @@ std::string_view FixedText(double inMagnitude, unsigned long inDecimals, std::sp
 {
 	char* const begin = outBuffer.data();
 	const auto decimals = static_cast<int>(std::min<unsigned long>(inDecimals, kMostDecimals));
-	const auto result
-		= std::to_chars(begin, begin + outBuffer.size(), inMagnitude, std::chars_format::fixed, decimals);
+	const auto result = std::to_chars(begin, begin + outBuffer.size(), inMagnitude, std::chars_format::fixed, decimals);
 	return {begin, result.ptr};
 }
 
@@ -97,7 +96,8 @@ bool ReadInteger(UTF16StringView inText, Integer& outValue)
 	outValue = 0;
 	const NumberText number = SkipToNumber(inText);
 	const std::size_t digits = CountDigits(number.mText);
-	const std::uint64_t largest = static_cast<std::uint64_t>(std::numeric_limits<Integer>::max()) + (number.mIsNegative ? 1 : 0);
+	const std::uint64_t largest
+		= static_cast<std::uint64_t>(std::numeric_limits<Integer>::max()) + (number.mIsNegative ? 1 : 0);
 	std::uint64_t magnitude = 0;
 	for (const UTF16Char digit : number.mText.substr(0, digits))
 	{
@@ -158,8 +158,10 @@ public:
 	{
 		constexpr std::int64_t kHuge = 400;   // beyond every double by far
 		double value = 0;
-		if (inExponent > kHuge)   return std::numeric_limits<double>::infinity();
-		if (inExponent < -kHuge)  return 0;
+		if (inExponent > kHuge)
+			return std::numeric_limits<double>::infinity();
+		if (inExponent < -kHuge)
+			return 0;
 		*mEnd = 'e';
 		const auto exponent = std::to_chars(mEnd + 1, mBuffer.data() + mBuffer.size(), inExponent);
 		const auto result = std::from_chars(mBuffer.data(), exponent.ptr, value);
@@ -204,7 +206,8 @@ double ReadDecimal(UTF16StringView inText)
 
 constexpr std::int64_t kLargestTerm = 2'147'483'646;
 
-__extension__ typedef unsigned __int128 Wide;   // NOLINT(modernize-use-using): an alias declaration takes no __extension__
+__extension__ typedef unsigned __int128
+	Wide;   // NOLINT(modernize-use-using): an alias declaration takes no __extension__
 
 // The value to come near to, exactly.
 struct Target

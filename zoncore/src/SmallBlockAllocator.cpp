@@ -18,9 +18,9 @@ namespace
 constexpr std::size_t kGranule = alignof(std::max_align_t);
 constexpr std::size_t kSizeClasses = 16;
 constexpr std::size_t kLargestPooled = kGranule * kSizeClasses;
-constexpr std::size_t kBatch = 32;                  // blocks that travel between a thread and the depot at once
-constexpr std::size_t kMostKept = 4 * kBatch;       // blocks of one size that a thread keeps for itself
-constexpr std::size_t kChunkBytes = 64 * 1024;      // what the depot asks the system for
+constexpr std::size_t kBatch = 32;               // blocks that travel between a thread and the depot at once
+constexpr std::size_t kMostKept = 4 * kBatch;    // blocks of one size that a thread keeps for itself
+constexpr std::size_t kChunkBytes = 64 * 1024;   // what the depot asks the system for
 
 struct Block
 {
@@ -112,7 +112,7 @@ enum class CacheState : std::uint8_t
 {
 	Unused,   // the thread has not disposed of anything yet: its end is not watched
 	Open,
-	Closed    // the thread is ending: its blocks go to the depot one by one
+	Closed   // the thread is ending: its blocks go to the depot one by one
 };
 
 struct ThreadCache
