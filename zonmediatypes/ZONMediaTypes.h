@@ -4,6 +4,8 @@
 /// The whole library in one header, and the entry points that a client calls around its use of it.
 
 #include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/AudioChannelMap.h"
+#include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
