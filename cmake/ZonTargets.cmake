@@ -34,8 +34,14 @@ function(zon_add_library inTarget inMacro)
 	if(type STREQUAL "STATIC_LIBRARY")
 		target_compile_definitions(${inTarget} PUBLIC ${inMacro}_STATIC)
 	endif()
+	if(type STREQUAL "SHARED_LIBRARY" AND CMAKE_SYSTEM_NAME STREQUAL "Linux")
+		set(exports "${CMAKE_CURRENT_SOURCE_DIR}/exports.map")
+		target_link_options(${inTarget} PRIVATE "LINKER:--version-script=${exports}")
+		set_target_properties(${inTarget} PROPERTIES LINK_DEPENDS "${exports}")
+	endif()
 	set_target_properties(${inTarget} PROPERTIES
 		VERSION ${zonmediatypes_VERSION}
 		SOVERSION ${zonmediatypes_VERSION_MAJOR}
-		POSITION_INDEPENDENT_CODE ON)
+		POSITION_INDEPENDENT_CODE ON
+		INSTALL_RPATH "$ORIGIN")
 endfunction()

@@ -1,0 +1,49 @@
+# What is installed, as three components that become the three Debian packages: runtime (the libraries), development
+# (headers and everything that finds the libraries) and companion (zonmedia).
+#
+# A shared and a static build may be installed into the same prefix; the CMake package chooses, see its file.
+include(CMakePackageConfigHelpers)
+
+set(package "${CMAKE_INSTALL_LIBDIR}/cmake/zonmediatypes")
+set(generated "${zonmediatypes_BINARY_DIR}/package")
+set(linkage static)
+if(BUILD_SHARED_LIBS)
+	set(linkage shared)
+endif()
+
+foreach(library IN ITEMS zoncore zonmediatypes)
+	install(TARGETS ${library} EXPORT ${library}Targets
+		LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}" COMPONENT runtime NAMELINK_COMPONENT development
+		ARCHIVE DESTINATION "${CMAKE_INSTALL_LIBDIR}" COMPONENT development)
+	install(EXPORT ${library}Targets NAMESPACE ${library}:: FILE ${library}-${linkage}-targets.cmake
+		DESTINATION "${package}" COMPONENT development)
+	install(DIRECTORY "${zonmediatypes_SOURCE_DIR}/${library}/" DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/${library}"
+		COMPONENT development FILES_MATCHING PATTERN "*.h" PATTERN src EXCLUDE)
+endforeach()
+install(FILES "${zonmediatypes_BINARY_DIR}/include/zonmediatypes/Version.h"
+	DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/zonmediatypes" COMPONENT development)
+
+configure_package_config_file("${CMAKE_CURRENT_LIST_DIR}/zonmediatypesConfig.cmake.in"
+	"${generated}/zonmediatypesConfig.cmake" INSTALL_DESTINATION "${package}" NO_SET_AND_CHECK_MACRO)
+write_basic_package_version_file("${generated}/zonmediatypesConfigVersion.cmake"
+	VERSION ${zonmediatypes_VERSION} COMPATIBILITY SameMajorVersion)
+install(FILES "${generated}/zonmediatypesConfig.cmake" "${generated}/zonmediatypesConfigVersion.cmake"
+	DESTINATION "${package}" COMPONENT development)
+
+# The .pc files find the prefix from where they lie, so that an installation can be moved.
+file(RELATIVE_PATH prefixFromPkgConfig "/prefix/${CMAKE_INSTALL_LIBDIR}/pkgconfig" /prefix)
+string(REGEX REPLACE "/$" "" prefixFromPkgConfig "${prefixFromPkgConfig}")
+foreach(library IN ITEMS zoncore zonmediatypes)
+	configure_file("${CMAKE_CURRENT_LIST_DIR}/${library}.pc.in" "${generated}/${library}.pc" @ONLY)
+	install(FILES "${generated}/${library}.pc" DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig" COMPONENT development)
+endforeach()
+
+if(TARGET zonmedia)
+	file(RELATIVE_PATH librariesFromPrograms "/prefix/${CMAKE_INSTALL_BINDIR}" "/prefix/${CMAKE_INSTALL_LIBDIR}")
+	set_target_properties(zonmedia PROPERTIES INSTALL_RPATH "$ORIGIN/${librariesFromPrograms}")
+	install(TARGETS zonmedia RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}" COMPONENT companion)
+endif()
+
+if(PROJECT_IS_TOP_LEVEL)
+	include(ZonPackages)
+endif()

@@ -1,0 +1,32 @@
+# Included by the tests' CMakeLists.txt: the library as others get it.
+
+# Each public header compiles alone.
+file(GLOB_RECURSE publicHeaders CONFIGURE_DEPENDS RELATIVE "${zonmediatypes_SOURCE_DIR}"
+	"${zonmediatypes_SOURCE_DIR}/zoncore/*.h" "${zonmediatypes_SOURCE_DIR}/zonmediatypes/*.h")
+list(FILTER publicHeaders EXCLUDE REGEX "/src/")
+set(loneHeaders)
+foreach(header IN LISTS publicHeaders)
+	string(REGEX REPLACE "[/.]" "_" name "${header}")
+	set(lone "${CMAKE_CURRENT_BINARY_DIR}/headers/${name}.cpp")
+	file(CONFIGURE OUTPUT "${lone}" CONTENT "#include \"@header@\"\n#include \"@header@\"\n" @ONLY)
+	list(APPEND loneHeaders "${lone}")
+endforeach()
+add_library(PublicHeaders OBJECT ${loneHeaders})
+zon_target_defaults(PublicHeaders)
+target_compile_options(PublicHeaders PRIVATE -O0)
+target_link_libraries(PublicHeaders PRIVATE zonmediatypes::zonmediatypes)
+
+# Installed or fetched, shared or static, found in three ways.
+if(BUILD_SHARED_LIBS AND ZON_INSTALL)
+	function(zon_add_adoption_test inWay)
+		add_test(NAME Adoption.${inWay} COMMAND "${CMAKE_CURRENT_SOURCE_DIR}/adoption/adopt.sh" ${inWay}
+			"${zonmediatypes_SOURCE_DIR}" "${zonmediatypes_BINARY_DIR}" "${CMAKE_CURRENT_BINARY_DIR}/adoption")
+		set_tests_properties(Adoption.${inWay} PROPERTIES ENVIRONMENT "CXX=${CMAKE_CXX_COMPILER}" TIMEOUT 600 ${ARGN})
+	endfunction()
+	zon_add_adoption_test(install FIXTURES_SETUP SharedInstallation)
+	zon_add_adoption_test(find_package-shared FIXTURES_REQUIRED SharedInstallation)
+	zon_add_adoption_test(pkg-config-shared FIXTURES_REQUIRED SharedInstallation)
+	zon_add_adoption_test(FetchContent-static FIXTURES_SETUP StaticInstallation PROCESSORS 2)
+	zon_add_adoption_test(find_package-static FIXTURES_REQUIRED StaticInstallation)
+	zon_add_adoption_test(pkg-config-static FIXTURES_REQUIRED StaticInstallation)
+endif()

@@ -1,0 +1,69 @@
+#!/bin/bash
+# One way of adopting the library, from outside: builds the program next to this script against it and runs that.
+#   usage: adopt.sh WAY SOURCE BUILD SCRATCH
+# SOURCE and BUILD are the library's; what is made in SCRATCH stays there, so that a second run has little to do.
+set -euo pipefail
+way=$1 source=$2 build=$3 scratch=$4
+here=$(cd "$(dirname "$0")" && pwd)
+mkdir -p "$scratch"
+
+# adopt NAME CMAKE-OPTION...
+adopt()
+{
+	local folder=$scratch/$1
+	shift
+	cmake -S "$here" -B "$folder" -G Ninja -DCMAKE_BUILD_TYPE=Debug "$@"
+	cmake --build "$folder"
+	"$folder/adopter"
+}
+
+# adopt_by_pkg_config KIND PKG-CONFIG-OPTION...
+adopt_by_pkg_config()
+{
+	local prefix=$scratch/installed-$1 kind=$1
+	shift
+	export PKG_CONFIG_PATH=$prefix/lib/pkgconfig
+	local flags
+	read -ra flags <<<"$(pkg-config "$@" --cflags --libs 'zonmediatypes >= 1')"
+	"${CXX:-c++}" -std=c++20 "$here/Adopter.cpp" -o "$scratch/pkg-config-$kind" "${flags[@]}"
+	LD_LIBRARY_PATH=$prefix/lib "$scratch/pkg-config-$kind"
+}
+
+# none WHAT COMMAND... fails when the command, run in the installation, prints anything.
+none()
+{
+	local what=$1 found
+	shift
+	found=$(cd "$scratch/installed-shared" && "$@" || true)
+	[ -z "$found" ] || { printf 'installed, and should not be: %s\n%s\n' "$what" "$found" >&2; exit 1; }
+}
+
+# Every exported name belongs to a namespace of the library's, or to the facets of 16-bit streams.
+foreign_exports()
+{
+	nm --dynamic --demangle --defined-only lib/lib*.so | grep '^[0-9a-f]' | cut -c 20- | grep -vE \
+		'^((typeinfo|typeinfo name|vtable|guard variable) for )?(zoncore::|zonmediatypes::|std::(ctype|__cxx11::numpunct|num_get|num_put)<unsigned short)'
+}
+
+case $way in
+	install)
+		cmake --install "$build" --prefix "$scratch/installed-shared"
+		none "internal headers" find include -path '*/src/*'
+		none "names of this build's folders" grep -rl -e "$source" -e "$build" include lib/cmake lib/pkgconfig
+		none "exports beside the interface" foreign_exports
+		;;
+	find_package-shared)
+		adopt find_package-shared -DADOPT_BY=find_package -DCMAKE_PREFIX_PATH="$scratch/installed-shared"
+		;;
+	FetchContent-static)
+		adopt FetchContent -DADOPT_BY=FetchContent -DADOPT_SOURCE="$source" -DBUILD_SHARED_LIBS=OFF -DZON_INSTALL=ON
+		cmake --install "$scratch/FetchContent" --prefix "$scratch/installed-static"
+		;;
+	find_package-static)
+		adopt find_package-static -DADOPT_BY=find_package -DADOPT_COMPONENTS=static \
+			-DCMAKE_PREFIX_PATH="$scratch/installed-static"
+		;;
+	pkg-config-shared) adopt_by_pkg_config shared ;;
+	pkg-config-static) adopt_by_pkg_config static --static ;;
+	*) echo "adopt.sh: no way is called '$way'" >&2; exit 2 ;;
+esac
