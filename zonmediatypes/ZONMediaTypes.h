@@ -9,6 +9,7 @@
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
+#include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 #include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/Version.h"

@@ -1,0 +1,555 @@
+#include "zonmediatypes/TimeConversionUtils.h"
+
+#include "zoncore/NumberConversion.h"
+#include "zoncore/WrappingArithmetic.h"
+#include "zonmediatypes/src/DropFrameCount.h"
+#include "zonmediatypes/src/SampleClock.h"
+
+#include <array>
+#include <limits>
+
+namespace zonmediatypes::utility
+{
+namespace
+{
+
+using zoncore::UTF16Char;
+using zoncore::UTF16String;
+using zoncore::UTF16StringView;
+using zoncore::utility::Magnitude;
+using zoncore::utility::TruncateTo;
+using zoncore::utility::WrappingAdd;
+using zoncore::utility::WrappingDivide;
+using zoncore::utility::WrappingMultiply;
+using zoncore::utility::WrappingSubtract;
+
+// The numerator and the denominator of NTSC rates: 30 frames become 30,000 in 1,001 seconds.
+constexpr std::int32_t kNTSCNumerator = 1'000;
+constexpr std::int32_t kNTSCDenominator = 1'001;
+
+constexpr std::int64_t kNoPosition = -1;   // what empty text is
+
+// Drop-frame numbering is that of 30 frames per second and of its whole multiples.
+constexpr std::int32_t kLowestDropFrameRate = 30;
+
+bool ReportMissingBeatInfo(std::atomic<bool>& ioDisabled, const char* inFunction, int inLine = __builtin_LINE())
+{
+	ReportMisuse(ioDisabled, "inBeatInfo", "programmer error!\n", inFunction, inLine);
+	return false;
+}
+
+// ---- Text to samples -------------------------------------------------------------------------------------------------
+
+// The numbers that text carries; mSubframes / mSubframeDivisor is a fraction of one frame.
+struct TimecodeFields
+{
+	std::int32_t mHours;
+	std::int32_t mMinutes;
+	std::int32_t mSeconds;
+	std::int32_t mFrames;
+	std::int32_t mSubframes;
+	std::int32_t mSubframeDivisor;
+};
+
+constexpr bool IsDigit(UTF16Char inChar)
+{
+	return static_cast<unsigned>(inChar) - '0' < 10;
+}
+
+// Takes the digits off the front of ioText; 0 for a number that does not fit.
+std::int32_t TakeField(UTF16StringView& ioText)
+{
+	constexpr std::uint64_t kLargest = std::numeric_limits<std::int32_t>::max();
+	std::uint64_t value = 0;
+	for (; !ioText.empty() && IsDigit(ioText.front()); ioText.remove_prefix(1))
+	{
+		if (value <= kLargest)
+			value = value * 10 + (ioText.front() - std::uint64_t{'0'});
+	}
+	return value <= kLargest ? static_cast<std::int32_t>(value) : 0;
+}
+
+// Takes the separators off the front of ioText; whether one of them was ".".
+bool TakeSeparators(UTF16StringView& ioText)
+{
+	bool hasPoint = false;
+	for (; !ioText.empty() && !IsDigit(ioText.front()); ioText.remove_prefix(1))
+		hasPoint = hasPoint || ioText.front() == '.';
+	return hasPoint;
+}
+
+// 10^inExponent, and the most negative value where that does not fit.
+constexpr std::int32_t PowerOfTen(std::size_t inExponent)
+{
+	constexpr auto kPowers = std::to_array<std::int32_t>(
+		{1, 10, 100, 1'000, 10'000, 100'000, 1'000'000, 10'000'000, 100'000'000, 1'000'000'000});
+	return inExponent < kPowers.size() ? kPowers[inExponent] : std::numeric_limits<std::int32_t>::min();
+}
+
+TimecodeFields ParseTimeCodeString(UTF16StringView inText)
+{
+	constexpr std::size_t kLabels = 4;
+	constexpr std::size_t kMostFields = 5;
+	// Fields stand behind zeros: the four values in front of any end are right-aligned labels.
+	std::array<std::int32_t, kLabels + kMostFields> values{};
+	std::size_t end = kLabels;
+	std::size_t lastFieldLength = 0;   // with all that follows in the text
+	bool hasPoint = false;
+	for (bool isComplete = false; !isComplete && end < values.size(); isComplete = hasPoint)
+	{
+		hasPoint = TakeSeparators(inText) || hasPoint;
+		if (inText.empty())
+			break;
+		lastFieldLength = inText.size();
+		values[end++] = TakeField(inText);
+	}
+	const bool hasFraction = hasPoint && end > kLabels;
+	const std::size_t labels = hasFraction ? end - 1 : end;
+	return {values[labels - 4], values[labels - 3], values[labels - 2], values[labels - 1],
+		hasFraction ? values[labels] : 0, hasFraction ? PowerOfTen(lastFieldLength) : 1};
+}
+
+// The frame that labels stand for when none is dropped. 32-bit, wrapping.
+std::int32_t CountFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
+{
+	const std::int32_t minutes = WrappingAdd(WrappingMultiply(inFields.mHours, 60), inFields.mMinutes);
+	const std::int32_t seconds = WrappingAdd(WrappingMultiply(minutes, 60), inFields.mSeconds);
+	return WrappingAdd(WrappingMultiply(seconds, inFrameRate), inFields.mFrames);
+}
+
+// The frame that drop-frame labels stand for; labels that are dropped stand for the first one that is not. The quotients
+// are exact at 30 and 60 only and serve every rate as they are. 32-bit, wrapping.
+std::int32_t CountDropFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
+{
+	const std::int32_t droppedPerMinute = inFrameRate / 15;
+	const std::int32_t droppedPerHour = WrappingMultiply(inFrameRate, 108) / 30;
+	const std::int32_t framesPerHour = WrappingSubtract(WrappingMultiply(inFrameRate, 3'600), droppedPerHour);
+	const std::int32_t framesPerTenMinutes = framesPerHour / 6;
+	const std::int32_t tens = inFields.mMinutes / 10;
+	const std::int32_t minutes = inFields.mMinutes % 10;
+
+	const bool isDropped = minutes != 0 && inFields.mSeconds == 0 && inFields.mFrames < droppedPerMinute;
+	const TimecodeFields rest{0, minutes, inFields.mSeconds, isDropped ? droppedPerMinute : inFields.mFrames, 0, 1};
+	const std::int32_t blocks
+		= WrappingAdd(WrappingMultiply(inFields.mHours, framesPerHour), WrappingMultiply(tens, framesPerTenMinutes));
+	return WrappingAdd(
+		blocks, WrappingSubtract(CountFrames(rest, inFrameRate), WrappingMultiply(droppedPerMinute, minutes)));
+}
+
+// The first sample at or behind a frame and a fraction of it. Wraps, but beyond the range of the integer formula the
+// result is that of doubles.
+std::int64_t FramesToSamples(std::int32_t inFrames, const TimecodeFields& inFields, std::int32_t inSampleRate,
+	std::int32_t inFrameRate, bool inNTSC)
+{
+	constexpr double kLargestExact = 0x7p60;
+	const std::int32_t rate = inNTSC ? WrappingMultiply(inFrameRate, kNTSCNumerator) : inFrameRate;
+	const std::int64_t factor = inNTSC ? kNTSCDenominator : 1;
+	const std::int64_t subframes = inFields.mSubframes;
+	const std::int64_t divisor = inFields.mSubframeDivisor;
+	const std::int64_t denominator
+		= rate * divisor;   // cannot overflow, nor can the products with one 32-bit term below
+	if (denominator == 0)
+		return 0;
+
+	const double estimate = static_cast<double>(denominator - 1)
+		+ inSampleRate
+			* (static_cast<double>(factor)
+				* (static_cast<double>(subframes) + static_cast<double>(inFrames) * static_cast<double>(divisor)));
+	if (estimate > kLargestExact)
+		return TruncateTo<std::int64_t>(estimate / static_cast<double>(denominator));
+	const std::int64_t scaled = WrappingMultiply(factor * inSampleRate, subframes + divisor * inFrames);
+	return WrappingDivide(WrappingAdd(scaled, denominator - 1), denominator);
+}
+
+// Decimal text in units of its smallest field: timecode fields one place to the left, hours lost.
+double ReadDecimal(UTF16StringView inText)
+{
+	const TimecodeFields fields = ParseTimeCodeString(inText);
+	const double units = fields.mFrames + static_cast<double>(fields.mSubframes) / fields.mSubframeDivisor;
+	return fields.mMinutes * 3'600.0 + (fields.mSeconds * 60.0 + (0.0 + units));
+}
+
+std::int64_t ReadSampleCount(UTF16StringView inText)
+{
+	long long count = 0;
+	zoncore::utility::StringToNumber(inText, count, 6);
+	return count;
+}
+
+// ---- Samples to text -------------------------------------------------------------------------------------------------
+
+// How a position is written as timecode; see the flags of the public function.
+struct TimecodeStyle
+{
+	bool mDropFrame = false;
+	bool mNTSC = false;
+	bool mFrameCountOnly = false;
+	bool mOmitFrames = false;
+	bool mSuppressLeadingZeros = false;
+	bool mShowSubframes = false;
+	bool mTotalMinutes = false;
+};
+
+// The magnitude of a position in frames, mNumerator / mDenominator.
+struct FramePosition
+{
+	std::uint64_t mNumerator;
+	std::uint64_t mDenominator;
+
+	std::uint64_t GetFrames() const { return mNumerator / mDenominator; }
+	std::uint64_t GetHundredths() const { return mNumerator * 100 / mDenominator; }
+};
+
+FramePosition SamplesToFrames(
+	std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
+{
+	const bool isScaled = inStyle.mDropFrame || inStyle.mNTSC;
+	const auto frameRate = static_cast<std::uint64_t>(inFrameRate) * (isScaled ? kNTSCNumerator : 1);
+	const auto sampleRate = static_cast<std::uint64_t>(inSampleRate) * (isScaled ? kNTSCDenominator : 1);
+	return {Magnitude(inSamples) * frameRate, sampleRate};
+}
+
+// Rates that positions can be divided by: frames per minute and per hour are 32-bit, wrapping, and not 0.
+bool CanDivideBy(std::int32_t inSampleRate, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
+{
+	const auto rate = static_cast<std::uint32_t>(inFrameRate);
+	const std::int32_t lowestRate = inStyle.mDropFrame ? kLowestDropFrameRate : 1;
+	return inSampleRate > 0 && inFrameRate >= lowestRate && rate * 60u != 0 && rate * 3'600u != 0;
+}
+
+// The frame count at 1000/1001 of a nominal rate, from the left to the right in doubles: one short on some frames.
+std::int32_t CountDropFrames(std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate)
+{
+	const double multiple = inFrameRate / 30.0;
+	const double perTenMinutes = inFrameRate * 600.0 / 1.001;
+	const double frames = perTenMinutes / (17'982.0 * multiple) * static_cast<double>(Magnitude(inSamples))
+		/ inSampleRate * 29.97 * multiple;
+	return TruncateTo<std::int32_t>(frames);
+}
+
+void AppendDropFrame(PositionText& ioText, std::uint64_t inFrames, std::int32_t inFrameRate)
+{
+	std::uint32_t hours = 0;
+	std::uint32_t minutes = 0;
+	std::uint32_t seconds = 0;
+	std::uint32_t frames = 0;
+	DropFrameToHMSF(static_cast<std::int64_t>(inFrames), inFrameRate, hours, minutes, seconds, frames);
+	for (const std::uint32_t label : {hours, minutes, seconds})
+	{
+		ioText.AppendNumber(label, 2);
+		ioText.Append(';');
+	}
+	ioText.AppendNumber(frames, 2);
+}
+
+// A field and ":". While ioSuppresses is set a 0 is left out; the first field that is written clears it.
+void AppendField(PositionText& ioText, std::uint64_t inValue, bool& ioSuppresses, std::size_t inLeadingWidth = 1)
+{
+	if (ioSuppresses && inValue == 0)
+		return;
+	ioText.AppendNumber(inValue, ioSuppresses ? inLeadingWidth : 2);
+	ioText.Append(':');
+	ioSuppresses = false;
+}
+
+void AppendNonDrop(
+	PositionText& ioText, const FramePosition& inPosition, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
+{
+	const auto perSecond = static_cast<std::uint32_t>(inFrameRate);
+	const std::uint32_t perMinute = perSecond * 60;
+	const std::uint32_t perHour = perSecond * 3'600;
+	const std::uint64_t total = inPosition.GetFrames();
+	const std::uint64_t hours = total / perHour;
+	const std::uint64_t minutes = total % perHour / perMinute;
+	const std::uint64_t rest = total % perHour % perMinute;
+
+	bool suppresses = inStyle.mSuppressLeadingZeros;
+	if (!inStyle.mTotalMinutes)
+		AppendField(ioText, hours, suppresses, 2);
+	AppendField(ioText, inStyle.mTotalMinutes ? minutes + hours * 60 : minutes, suppresses);
+	if (inStyle.mOmitFrames)
+		return ioText.AppendNumber(rest / perSecond, 2);
+	AppendField(ioText, rest / perSecond, suppresses);
+	ioText.AppendNumber(rest % perSecond, suppresses ? 1 : PaddedDigits(inFrameRate));
+	if (!inStyle.mShowSubframes)
+		return;
+	ioText.Append('.');
+	ioText.AppendNumber(inPosition.GetHundredths() % 100, 2);
+}
+
+void AppendTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
+	const TimecodeStyle& inStyle)
+{
+	if (!CanDivideBy(inSampleRate, inFrameRate, inStyle))
+		return ioText.Append('0');
+	if (inStyle.mDropFrame && inStyle.mFrameCountOnly)
+		return ioText.AppendNumber(CountDropFrames(inSamples, inSampleRate, inFrameRate));
+	const FramePosition position = SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle);
+	if (inStyle.mFrameCountOnly)
+		return ioText.AppendNumber(static_cast<std::int32_t>(position.GetFrames()));
+	if (inSamples < 0)
+		ioText.Append('-');
+	if (inStyle.mDropFrame)
+		AppendDropFrame(ioText, position.GetFrames(), inFrameRate);
+	else
+		AppendNonDrop(ioText, position, inFrameRate, inStyle);
+}
+
+bool WriteTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
+	const TimecodeStyle& inStyle)
+{
+	SetText(outText, AppendTimecode, inSamples, inSampleRate, inFrameRate, inStyle);
+	return true;
+}
+
+void AppendDecimalFraction(
+	PositionText& ioText, std::uint64_t inSeconds, std::uint64_t inRest, std::int32_t inSampleRate)
+{
+	constexpr std::uint64_t kTenHours = 36'000;
+	ioText.Append('.');
+	if (inSeconds >= kTenHours)
+		return ioText.AppendNumber(inRest * 100 / static_cast<std::uint32_t>(inSampleRate), 2);
+	const double milliseconds = (static_cast<double>(inRest) + 0.5) * 1'000.0 / inSampleRate;
+	ioText.AppendNumber(TruncateTo<std::int64_t>(milliseconds), 3);
+}
+
+void AppendDecimal(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction)
+{
+	if (inSampleRate <= 0)
+		return ioText.Append('0');
+	const auto rate = static_cast<std::uint32_t>(inSampleRate);
+	const std::uint64_t samples = Magnitude(inSamples);
+	const std::uint64_t seconds = samples / rate;
+	const std::uint64_t minutes = seconds / 60;
+	if (seconds < 3'600)
+	{
+		ioText.Append(inSamples < 0 ? "  -" : "   ");
+		ioText.AppendNumber(minutes);
+	}
+	else
+	{
+		ioText.Append(inSamples < 0 ? "-" : "");
+		ioText.AppendNumber(seconds / 3'600);
+		ioText.Append(':');
+		ioText.AppendNumber(minutes % 60, 2);
+	}
+	ioText.Append(':');
+	ioText.AppendNumber(seconds % 60, 2);
+	if (!inOmitFraction)
+		AppendDecimalFraction(ioText, seconds, samples % rate, inSampleRate);
+}
+
+void AppendMilliseconds(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate)
+{
+	if (inSampleRate == 0)
+		return ioText.Append('0');
+	const double tenths = static_cast<double>(inSamples) * 10'000.0 / inSampleRate + 0.5;
+	ioText.AppendNumber((tenths - Fraction(tenths)) / 10.0);
+}
+
+void AppendSampleCount(PositionText& ioText, std::int64_t inSamples)
+{
+	ioText.AppendNumber(inSamples);
+}
+
+}   // namespace
+
+bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inTimecode, std::int32_t inSampleRate,
+	std::int32_t inFrameRate, bool inNTSC, bool inDropFrame)
+{
+	if (inTimecode.empty())
+	{
+		outSamples = kNoPosition;
+		return true;
+	}
+	const TimecodeFields fields = ParseTimeCodeString(inTimecode);
+	const std::int32_t frames = inDropFrame ? CountDropFrames(fields, inFrameRate) : CountFrames(fields, inFrameRate);
+	outSamples = FramesToSamples(frames, fields, inSampleRate, inFrameRate, inNTSC);
+	return true;
+}
+
+bool ConvertTimecodeToSamples(std::int64_t& outSamples, const UTF16String& inTimecode, std::int32_t inSampleRate,
+	std::int32_t inFrameRate, bool inNTSC, bool inDropFrame)
+{
+	return ConvertTimecodeToSamples(
+		outSamples, UTF16StringView(inTimecode), inSampleRate, inFrameRate, inNTSC, inDropFrame);
+}
+
+bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, TimecodeFormat inFormat,
+	std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo, bool inIsDuration)
+{
+	constexpr const char* kSignature
+		= "bool zonmediatypes::utility::ConvertTimecodeToSamples(std::int64_t &, const zoncore::UTF16String &, "
+		  "TimecodeFormat, std::int32_t, std::int32_t, BeatInfo *, bool)";
+	if (inText.empty())
+	{
+		outSamples = kNoPosition;
+		return true;
+	}
+	switch (inFormat)
+	{
+	case kTimecodeFormat_Decimal:
+		outSamples = TruncateTo<std::int64_t>(inSampleRate * ReadDecimal(inText) + 0.5);
+		return true;
+	case kTimecodeFormat_Milliseconds:
+		outSamples = TruncateTo<std::int64_t>(inSampleRate * ReadDecimal(inText) / 1'000.0 + 0.5);
+		return true;
+	case kTimecodeFormat_Samples:
+		outSamples = ReadSampleCount(inText);
+		return true;
+	case kTimecodeFormat_Timecode:
+	case kTimecodeFormat_Frames:
+	case kTimecodeFormat_TimecodeSubframes:
+		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, false, false);
+	case kTimecodeFormat_TimecodeNTSC:
+	case kTimecodeFormat_TimecodeNTSCAlt:
+	case kTimecodeFormat_TimecodeNTSCAlt2:
+		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, true, false);
+	case kTimecodeFormat_TimecodeDropFrame:
+	case kTimecodeFormat_TimecodeDropFrameAlt:
+	case kTimecodeFormat_FramesDropFrame:
+		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, true, true);
+	case kTimecodeFormat_Beats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		outSamples = TruncateTo<std::int64_t>(ReadDecimal(inText) * (inSampleRate * 60.0 / inBeatInfo->dTempo) + 0.5);
+		return true;
+	case kTimecodeFormat_BarsAndBeats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		outSamples = ConvertBarsAndBeatsToSamples(inText, inSampleRate, *inBeatInfo, inIsDuration);
+		return true;
+	case kTimecodeFormat_None:
+		break;
+	}
+	outSamples = 0;   // deliberate for unknown formats, too
+	return true;
+}
+
+bool ConvertTimecodeToSamples(std::int64_t& outSamples, const UTF16String& inText, TimecodeFormat inFormat,
+	std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo, bool inIsDuration)
+{
+	return ConvertTimecodeToSamples(
+		outSamples, UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
+}
+
+bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate,
+	TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
+{
+	constexpr const char* kSignature
+		= "bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
+		  "TimecodeFormat, std::int32_t, const BeatInfo *, bool)";
+	const auto writeTimecode = [&](const TimecodeStyle& inStyle)
+	{ return WriteTimecode(outText, inSamples, inSampleRate, inFrameRate, inStyle); };
+	switch (inFormat)
+	{
+	case kTimecodeFormat_Decimal:
+		ConvertSamplesToDecimalTimecode(outText, inSamples, inSampleRate, false);
+		return true;
+	case kTimecodeFormat_Samples:
+		SetText(outText, AppendSampleCount, inSamples);
+		return true;
+	case kTimecodeFormat_Milliseconds:
+		SetText(outText, AppendMilliseconds, inSamples, inSampleRate);
+		return true;
+	case kTimecodeFormat_Timecode:
+		return writeTimecode({});
+	case kTimecodeFormat_TimecodeNTSC:
+	case kTimecodeFormat_TimecodeNTSCAlt:
+	case kTimecodeFormat_TimecodeNTSCAlt2:
+		return writeTimecode({.mNTSC = true});
+	case kTimecodeFormat_TimecodeDropFrame:
+	case kTimecodeFormat_TimecodeDropFrameAlt:
+		return writeTimecode({.mDropFrame = true});
+	case kTimecodeFormat_Frames:
+		return writeTimecode({.mFrameCountOnly = true});
+	case kTimecodeFormat_FramesDropFrame:
+		return writeTimecode({.mDropFrame = true, .mFrameCountOnly = true});
+	case kTimecodeFormat_TimecodeSubframes:
+		return writeTimecode({.mSuppressLeadingZeros = true, .mShowSubframes = true});
+	case kTimecodeFormat_Beats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		ConvertSamplesToBeats(outText, inSamples, inSampleRate, inBeatInfo->dTempo);
+		return true;
+	case kTimecodeFormat_BarsAndBeats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		return ConvertSamplesToBarsAndBeats(
+			outText, static_cast<double>(inSamples), inSampleRate, *inBeatInfo, inIsDuration, 2);
+	case kTimecodeFormat_None:
+		break;
+	}
+	return true;
+}
+
+bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate,
+	std::int32_t inFrameRate, bool inDropFrame, bool inNTSC, bool inFrameCountOnly, bool inOmitFrames,
+	bool inSuppressLeadingZeros, bool inShowSubframes, bool inTotalMinutes)
+{
+	if (inDropFrame && inNTSC)
+	{
+		static constinit std::atomic<bool> sDisabled = false;
+		ReportMisuse(sDisabled, "false", "ConvertSamplesToTimecode programmer error!",
+			"bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
+			"std::int32_t, bool, bool, bool, bool, bool, bool, bool)");
+		return false;
+	}
+	return WriteTimecode(outText, inSamples, inSampleRate, inFrameRate,
+		{inDropFrame, inNTSC, inFrameCountOnly, inOmitFrames, inSuppressLeadingZeros, inShowSubframes, inTotalMinutes});
+}
+
+void ConvertSamplesToDecimalTimecode(
+	UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction)
+{
+	SetText(outText, AppendDecimal, inSamples, inSampleRate, inOmitFraction);
+}
+
+std::int64_t DropFrameToHMSF(std::int64_t inFrame, std::int32_t inFrameRate, std::uint32_t& outHours,
+	std::uint32_t& outMinutes, std::uint32_t& outSeconds, std::uint32_t& outFrames) noexcept
+{
+	if (inFrameRate < kLowestDropFrameRate)
+		return 0;
+	const auto multiple = static_cast<std::uint64_t>(inFrameRate / kLowestDropFrameRate);
+	const DropFrameCount count{30 * multiple, 2 * multiple};
+	std::uint64_t rest = Magnitude(inFrame);
+	if (rest >= count.PerHour())
+	{
+		outHours = static_cast<std::uint32_t>(rest / count.PerHour());
+		rest %= count.PerHour();
+	}
+	if (rest >= count.PerTenMinutes())
+	{
+		outMinutes = static_cast<std::uint32_t>(rest / count.PerTenMinutes() * 10);
+		rest %= count.PerTenMinutes();
+	}
+	if (rest >= count.PerFullMinute())
+	{
+		// The rest keeps the labels that the short minutes drop, so that it splits into seconds and frames as usual.
+		const std::uint64_t shortMinutes = (rest - count.PerFullMinute()) / count.PerShortMinute() + 1;
+		outMinutes += static_cast<std::uint32_t>(shortMinutes);
+		rest -= shortMinutes * count.PerShortMinute();
+	}
+	std::uint64_t seconds = 0;
+	if (rest >= count.mNominal)
+	{
+		seconds = rest / count.mNominal;
+		outSeconds = static_cast<std::uint32_t>(seconds);
+	}
+	outFrames = static_cast<std::uint32_t>(rest % count.mNominal);
+	return static_cast<std::int64_t>(seconds);
+}
+
+}   // namespace zonmediatypes::utility
