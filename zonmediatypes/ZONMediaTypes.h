@@ -12,6 +12,7 @@
 #include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 #include "zonmediatypes/TimeUtils.h"
+#include "zonmediatypes/Timecode.h"
 #include "zonmediatypes/Version.h"
 
 namespace zonmediatypes

@@ -2,6 +2,7 @@
 
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
+#include "zonmediatypes/src/DropFrame.h"
 
 #include <array>
 #include <cstddef>
@@ -21,10 +22,10 @@ enum class DisplayKind : std::uint8_t
 	None   ///< no display at all
 };
 
-/// How the frames of a second that is not a whole number of frames long are numbered.
+/// How the frames of a rate that has no whole number of them in a second are numbered.
 enum class FrameNumbering : std::uint8_t
 {
-	Straight,   ///< seconds are whole numbers of frames, or are counted as if they were
+	Straight,   ///< in one way only
 	NonDrop,
 	Drop
 };
@@ -33,7 +34,8 @@ struct TimeDisplayRow
 {
 	TimeDisplay mDisplay;
 	DisplayKind mKind;
-	FrameRate mRate = kFrameRate_Zero;   ///< in which the display counts; of kind Frames, Film and Samples the caller's
+	FrameRate mRate = kFrameRate_Zero;   ///< its own rate; kinds Frames, Film and Samples count at the caller's
+	DropFrameCount mCount{};             ///< labels of a display with a rate of its own
 	FrameNumbering mNumbering = FrameNumbering::Straight;
 	int mFramesPerFoot = 0;
 
@@ -43,25 +45,40 @@ struct TimeDisplayRow
 	}
 };
 
+/// A display that counts at a rate of its own. A second that is not a whole number of frames long is numbered as if the
+/// frame that it ends in were whole; drop-frame numbering makes up for that with two labels of every thirty.
+consteval TimeDisplayRow FixedRateDisplay(TimeDisplay inDisplay, FrameRate inRate,
+	FrameNumbering inNumbering = FrameNumbering::Straight, DisplayKind inKind = DisplayKind::Timecode)
+{
+	const std::int64_t duration = inRate.GetTicksPerFrame();
+	const auto nominal = static_cast<std::uint64_t>((kTicksPerSecond + duration - 1) / duration);
+	return {inDisplay, inKind, inRate, {nominal, inNumbering == FrameNumbering::Drop ? nominal / 15 : 0}, inNumbering};
+}
+
+consteval TimeDisplayRow FilmDisplay(TimeDisplay inDisplay, int inFramesPerFoot)
+{
+	return {inDisplay, DisplayKind::Film, kFrameRate_Zero, {}, FrameNumbering::Straight, inFramesPerFoot};
+}
+
 // clang-format off
 inline constexpr auto kTimeDisplayTable = std::to_array<TimeDisplayRow>({
-	{kTimeDisplay_24Timecode,          DisplayKind::Timecode, kFrameRate_Film24},
-	{kTimeDisplay_25Timecode,          DisplayKind::Timecode, kFrameRate_VideoPAL},
-	{kTimeDisplay_2997DropTimecode,    DisplayKind::Timecode, kFrameRate_VideoNTSC, FrameNumbering::Drop},
-	{kTimeDisplay_2997NonDropTimecode, DisplayKind::Timecode, kFrameRate_VideoNTSC, FrameNumbering::NonDrop},
-	{kTimeDisplay_30Timecode,          DisplayKind::Timecode, kFrameRate_Video30},
-	{kTimeDisplay_50Timecode,          DisplayKind::Timecode, kFrameRate_VideoPAL_HD},
-	{kTimeDisplay_5994DropTimecode,    DisplayKind::Timecode, kFrameRate_VideoNTSC_HD, FrameNumbering::Drop},
-	{kTimeDisplay_5994NonDropTimecode, DisplayKind::Timecode, kFrameRate_VideoNTSC_HD, FrameNumbering::NonDrop},
-	{kTimeDisplay_60Timecode,          DisplayKind::Timecode, kFrameRate_Video60},
-	{kTimeDisplay_Frames,              DisplayKind::Frames},
-	{kTimeDisplay_23976Timecode,       DisplayKind::Timecode, kFrameRate_23976},
-	{kTimeDisplay_16mmFeetFrames,      DisplayKind::Film, kFrameRate_Zero, FrameNumbering::Straight, 40},
-	{kTimeDisplay_35mmFeetFrames,      DisplayKind::Film, kFrameRate_Zero, FrameNumbering::Straight, 16},
-	{kTimeDisplay_48Timecode,          DisplayKind::Timecode, kFrameRate_Film48},
-	{kTimeDisplay_AudioSamples,        DisplayKind::Samples},
-	{kTimeDisplay_Milliseconds,        DisplayKind::Milliseconds, kFrameRate_Video1000},
-	{kTimeDisplay_Auto,                DisplayKind::Auto},
+	FixedRateDisplay(kTimeDisplay_24Timecode,          kFrameRate_Film24),
+	FixedRateDisplay(kTimeDisplay_25Timecode,          kFrameRate_VideoPAL),
+	FixedRateDisplay(kTimeDisplay_2997DropTimecode,    kFrameRate_VideoNTSC, FrameNumbering::Drop),
+	FixedRateDisplay(kTimeDisplay_2997NonDropTimecode, kFrameRate_VideoNTSC, FrameNumbering::NonDrop),
+	FixedRateDisplay(kTimeDisplay_30Timecode,          kFrameRate_Video30),
+	FixedRateDisplay(kTimeDisplay_50Timecode,          kFrameRate_VideoPAL_HD),
+	FixedRateDisplay(kTimeDisplay_5994DropTimecode,    kFrameRate_VideoNTSC_HD, FrameNumbering::Drop),
+	FixedRateDisplay(kTimeDisplay_5994NonDropTimecode, kFrameRate_VideoNTSC_HD, FrameNumbering::NonDrop),
+	FixedRateDisplay(kTimeDisplay_60Timecode,          kFrameRate_Video60),
+	{kTimeDisplay_Frames, DisplayKind::Frames},
+	FixedRateDisplay(kTimeDisplay_23976Timecode,       kFrameRate_23976),
+	FilmDisplay(kTimeDisplay_16mmFeetFrames, 40),
+	FilmDisplay(kTimeDisplay_35mmFeetFrames, 16),
+	FixedRateDisplay(kTimeDisplay_48Timecode,          kFrameRate_Film48),
+	{kTimeDisplay_AudioSamples, DisplayKind::Samples},
+	FixedRateDisplay(kTimeDisplay_Milliseconds, kFrameRate_Video1000, FrameNumbering::Straight, DisplayKind::Milliseconds),
+	{kTimeDisplay_Auto, DisplayKind::Auto},
 });
 // clang-format on
 

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <cstdint>
+
+namespace zonmediatypes
+{
+
+/// Drop-frame numbering skips the first labels of every minute that is not a multiple of ten.
+struct DropFrameCount
+{
+	std::uint64_t mNominal;   ///< frame labels per second
+	std::uint64_t mDropped;   ///< labels skipped at the start of a short minute; 0 without drop-frame numbering
+
+	constexpr std::uint64_t PerFullMinute() const noexcept { return 60 * mNominal; }
+	constexpr std::uint64_t PerShortMinute() const noexcept { return PerFullMinute() - mDropped; }
+	constexpr std::uint64_t PerTenMinutes() const noexcept { return PerFullMinute() + 9 * PerShortMinute(); }
+	constexpr std::uint64_t PerHour() const noexcept { return 6 * PerTenMinutes(); }
+};
+
+inline constexpr DropFrameCount kDropFrame_2997{30, 2};
+inline constexpr DropFrameCount kDropFrame_5994{60, 4};
+static_assert(kDropFrame_2997.PerTenMinutes() == 17'982 && kDropFrame_2997.PerHour() == 107'892);
+static_assert(kDropFrame_5994.PerTenMinutes() == 35'964 && kDropFrame_5994.PerHour() == 215'784);
+
+/// Hours, minutes, seconds and frames.
+struct HMSF
+{
+	std::uint32_t mHours;
+	std::uint32_t mMinutes;
+	std::uint32_t mSeconds;
+	std::uint64_t mFrames;
+
+	friend constexpr bool operator==(const HMSF&, const HMSF&) noexcept = default;
+};
+
+/// Splits a frame count when every second has inNominal labels, at least one. Hours wrap at 24.
+constexpr HMSF SplitFrames(std::uint64_t inFrames, std::uint64_t inNominal) noexcept
+{
+	const std::uint64_t seconds = inFrames / inNominal;
+	return {static_cast<std::uint32_t>(seconds / 3'600 % 24), static_cast<std::uint32_t>(seconds / 60 % 60),
+		static_cast<std::uint32_t>(seconds % 60), inFrames % inNominal};
+}
+
+/// Splits a frame count into drop-frame labels: puts the dropped ones back, then splits as usual. Hours wrap at 24.
+constexpr HMSF SplitDropFrames(std::uint64_t inFrames, DropFrameCount inCount) noexcept
+{
+	const std::uint64_t tens = inFrames / inCount.PerTenMinutes();
+	const std::uint64_t rest = inFrames % inCount.PerTenMinutes();
+	const std::uint64_t shortMinutes   // [0, 9]
+		= rest < inCount.PerFullMinute() ? 0 : (rest - inCount.PerFullMinute()) / inCount.PerShortMinute() + 1;
+	return SplitFrames(inFrames + inCount.mDropped * (9 * tens + shortMinutes), inCount.mNominal);
+}
+static_assert(SplitDropFrames(1'800, kDropFrame_2997) == HMSF{0, 1, 0, 2});
+static_assert(SplitDropFrames(17'982, kDropFrame_2997) == HMSF{0, 10, 0, 0});
+
+}   // namespace zonmediatypes
