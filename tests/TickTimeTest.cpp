@@ -1,0 +1,272 @@
+#include "zonmediatypes/TickTime.h"
+
+#include "zoncore/Debug.h"
+#include "zoncore/Error.h"
+#include "zoncore/StringUtils.h"
+#include "zoncore/UTF16String.h"
+#include "zoncore/WrappingArithmetic.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <array>
+#include <cmath>
+#include <csignal>
+#include <iomanip>
+#include <limits>
+#include <sstream>
+#include <string>
+#include <vector>
+
+namespace zonmediatypes
+{
+namespace
+{
+
+constexpr std::int64_t kMost = std::numeric_limits<std::int64_t>::max();
+constexpr std::int64_t kLeast = std::numeric_limits<std::int64_t>::min();
+constexpr FrameRate kTen(10);
+
+static_assert(kTime_Zero == TickTime() && kTime_Zero.GetTicks() == 0);
+static_assert(kTime_Max.GetTicks() == 91'445'760'000'000'000);
+static_assert(kTime_Min.GetTicks() == -91'445'760'000'000'000);
+static_assert(kTime_Invalid.GetTicks() == -101'606'400'000'000'000);
+static_assert(TickTime(1) > kTime_Zero && TickTime(-1) <= kTime_Zero && TickTime(1) != TickTime(2));
+
+template <class Operation>
+constexpr std::int64_t Apply(std::int64_t inTicks, Operation inOperation)
+{
+	TickTime time(inTicks);
+	inOperation(time);
+	return time.GetTicks();
+}
+
+// ---- Frames ----------------------------------------------------------------------------------------------------------
+
+TEST(TickTimeFrames, CountsTowardZero)
+{
+	EXPECT_EQ(TickTime(-9).ToFrame64(kTen), 0);
+	EXPECT_EQ(TickTime(-10).ToFrame64(kTen), -1);
+	EXPECT_EQ(TickTime(-19).ToFrame64(kTen), -1);
+	EXPECT_EQ(TickTime(19).ToFrame64(kTen), 1);
+	EXPECT_EQ(TickTime(25).ToFrame64(FrameRate(-10)), -2);
+	EXPECT_EQ(TickTime(kLeast).ToFrame64(FrameRate(-1)), kLeast);
+	for (const FrameRate unusable : {FrameRate(0), kFrameRate_Zero})
+		EXPECT_EQ(TickTime(kMost).ToFrame64(unusable), 0);
+	EXPECT_EQ(TickTime(0x1'2345'6789'0).ToFrame32(FrameRate(0x10)), 0x2345'6789);
+	EXPECT_EQ(TickTime(0xFFFF'FFFFll).ToFrame32(FrameRate(1)), -1);
+}
+
+TEST(TickTimeFrames, MovesByFrames)
+{
+	EXPECT_EQ(Apply(1, [](TickTime& t) { t.AddFrames(90, kFrameRate_VideoPAL); }), 914'457'600'001);
+	EXPECT_EQ(Apply(0, [](TickTime& t) { t.AddFrames(-2, kTen); }), -20);
+	EXPECT_EQ(Apply(0, [](TickTime& t) { t.AddFrames(3, kFrameRate_Zero); }), kMost - 2);   // wraps
+}
+
+struct AlignCase
+{
+	std::int64_t mDuration, mTicks, mAligned, mCeil, mNearest;
+};
+
+TEST(TickTimeFrames, Aligns)
+{
+	for (const AlignCase& row : std::to_array<AlignCase>({
+			 {10, 0, 0, 0, 0},
+			 {10, 1, 0, 10, 0},
+			 {10, 4, 0, 10, 0},
+			 {10, 5, 0, 10, 10},
+			 {10, 15, 10, 20, 20},
+			 {10, 20, 20, 20, 20},
+			 {10, -4, 0, 0, 0},
+			 {10, -5, 0, 0, -10},
+			 {10, -10, -10, 0, -10},
+			 {10, -15, -10, 0, -20},
+			 {10, -19, -10, -10, -20},
+			 {10, -25, -20, -10, -30},
+			 {3, 1, 0, 3, 0},
+			 {3, 2, 0, 3, 3},
+			 {-10, 15, 10, 0, 10},
+			 {0, 15, 15, 15, 15},
+			 {kMost, 15, 15, 15, 15},
+			 {0, kMost, kMost, kMost, kMost},   // not clamped
+			 {1, kTime_Max.GetTicks() + 1, kTime_Max.GetTicks() + 1, kTime_Max.GetTicks() + 1, kTime_Max.GetTicks()},
+			 {1, kTime_Invalid.GetTicks(), kTime_Invalid.GetTicks(), kTime_Invalid.GetTicks(), kTime_Min.GetTicks()},
+			 {-1, kLeast, kLeast, kMost - 1, kTime_Min.GetTicks()},
+		 }))
+	{
+		SCOPED_TRACE(testing::Message() << row.mTicks << " at " << row.mDuration);
+		const FrameRate rate(row.mDuration);
+		EXPECT_EQ(Apply(row.mTicks, [&](TickTime& t) { t.AlignToFrame(rate); }), row.mAligned);
+		EXPECT_EQ(Apply(row.mTicks, [&](TickTime& t) { t.AlignToNearestFrame(rate); }), row.mNearest);
+		EXPECT_EQ(Apply(row.mTicks, [&](TickTime& t) { t.AlignToFrameCeil(rate); }), row.mCeil);
+	}
+}
+
+TEST(TickTimeFrames, CalculatesTheRateOfACount)
+{
+	const auto rate = [](std::int64_t inTicks, unsigned long long inCount)
+	{
+		FrameRate result(7);
+		TickTime(inTicks).CalculateFrameRate(inCount, result);
+		return result;
+	};
+	EXPECT_EQ(rate(kTicksPerSecond, 30), kFrameRate_Video30);
+	EXPECT_EQ(rate(kTicksPerSecond, 0), kFrameRate_Zero);
+	EXPECT_EQ(rate(29, 30), kFrameRate_Zero);
+	EXPECT_EQ(rate(-59, 30), FrameRate(-1));
+	EXPECT_EQ(rate(59, 0xFFFF'FFFF'FFFF'FFE2), FrameRate(-1));   // a count is signed
+	EXPECT_EQ(rate(kLeast, 0xFFFF'FFFF'FFFF'FFFF), FrameRate(kLeast));
+}
+
+// ---- Arithmetic ------------------------------------------------------------------------------------------------------
+
+TEST(TickTimeArithmetic, WrapsAndTruncates)
+{
+	constexpr TickTime second(kTicksPerSecond);
+	static_assert((second / 2).GetTicks() == 127'008'000'000 && (second / -2).GetTicks() == -127'008'000'000);
+	static_assert((TickTime(7) / -2).GetTicks() == -3 && (TickTime(-7) / 2.0).GetTicks() == -3);
+	static_assert((TickTime(-1) / 4'294'967'295u).GetTicks() == 0 && (TickTime(kLeast) / -1).GetTicks() == kLeast);
+	static_assert((TickTime(-2) * 4'294'967'295u).GetTicks() == -8'589'934'590);
+	static_assert((TickTime(kMost) * 2).GetTicks() == -2 && (TickTime(3) * -0.5).GetTicks() == -1);
+	static_assert(second / TickTime(kTicksPerSecond / 4) == 4.0);
+	static_assert((-TickTime(kLeast)).GetTicks() == kLeast && TickTime(kLeast).Abs().GetTicks() == kLeast);
+	static_assert((TickTime(kMost) + TickTime(1)).GetTicks() == kLeast);
+	static_assert((TickTime(kLeast) - TickTime(1)).GetTicks() == kMost);
+	EXPECT_EQ((TickTime(kMost) * 2.0).GetTicks(), kLeast);
+	EXPECT_EQ((TickTime(1) / std::nan("")).GetTicks(), kLeast);
+	EXPECT_EQ(Apply(-5, [](TickTime& t) { t.Abs(); }), 5);
+	EXPECT_EQ(Apply(-5, [](TickTime& t) { t = t.Abs() * 3; }), 15);
+}
+
+// ---- Division by zero ------------------------------------------------------------------------------------------------
+
+// Records reports and lets the operation go on.
+class ZeroDivisor : public testing::Test
+{
+protected:
+	static void SetUpTestSuite() { testing::FLAGS_gtest_death_test_style = "threadsafe"; }
+
+	void SetUp() override
+	{
+		mDialog = zoncore::debug::SetContractDialog(
+			[this](const char* inCondition, const char* inPath, const char* inSignature, int inLine)
+			{
+				EXPECT_STREQ(inPath, "zonmediatypes/src/TickTime.cpp");
+				EXPECT_GT(inLine, 0);
+				mReports.push_back(std::string(inCondition) + " in " + inSignature);
+				return true;   // without a debugger nothing breaks
+			});
+		mReporter = zoncore::config::SetErrorReporter(
+			[this](int inLevel, const char* inKey, const std::vector<zoncore::config::ReplacementValue>& inValues)
+			{
+				EXPECT_EQ(inLevel, 0);
+				EXPECT_STREQ(inKey, kKey);
+				EXPECT_TRUE(inValues.empty());
+				++mErrors;
+			});
+	}
+
+	void TearDown() override
+	{
+		zoncore::debug::SetContractDialog(mDialog);
+		zoncore::config::SetErrorReporter(mReporter);
+	}
+
+	static constexpr const char* kKey = "$$$/zoncore/utility/Error/Contract/InputContractViolation="
+										"An input contract violation has occurred!";
+
+	zoncore::debug::ContractDialog mDialog;
+	zoncore::config::ErrorReporter mReporter;
+	std::vector<std::string> mReports;
+	int mErrors = 0;
+};
+
+TEST_F(ZeroDivisor, IsReportedByEachOperatorBeforeItGoesOn)
+{
+	EXPECT_EQ((TickTime(kTicksPerSecond) / 0.0).GetTicks(), kLeast);
+	EXPECT_EQ(Apply(1, [](TickTime& t) { t /= -0.0; }), kLeast);
+	EXPECT_TRUE(std::isinf(TickTime(1) / kTime_Zero));
+	EXPECT_TRUE(std::isnan(kTime_Zero / kTime_Zero));
+	const std::string ratio
+		= "inRHS.mTicks != 0 in double zonmediatypes::TickTime::operator/(const zonmediatypes::TickTime &) const";
+	EXPECT_THAT(mReports,
+		testing::ElementsAre("inValue != 0 in zonmediatypes::TickTime zonmediatypes::TickTime::operator/(double) const",
+			"inValue != 0 in zonmediatypes::TickTime &zonmediatypes::TickTime::operator/=(double)",
+			"inValue != 0 in zonmediatypes::TickTime &zonmediatypes::TickTime::operator/=(double)", ratio, ratio));
+	EXPECT_EQ(mErrors, 5);
+}
+
+TEST_F(ZeroDivisor, OfAnIntegerIsADivideFaultAfterItsReports)
+{
+	const auto divide = [this](auto inDivisor)
+	{
+		mReports.clear();
+		static_cast<void>(TickTime(1) / inDivisor);
+	};
+	// The last report is printed by the process that dies.
+	zoncore::config::SetErrorReporter(
+		[this](auto&&...)
+		{
+			if (mReports.size() == 2)
+				std::fprintf(stderr, "%s; %s", mReports[0].c_str(), mReports[1].c_str());
+		});
+	const auto reports = [](const std::string& inType)
+	{
+		return testing::HasSubstr("inValue != 0 in zonmediatypes::TickTime zonmediatypes::TickTime::operator/(" + inType
+			+ ") const; inValue != 0 in zonmediatypes::TickTime &zonmediatypes::TickTime::operator/=(" + inType + ")");
+	};
+	EXPECT_EXIT(divide(0), testing::KilledBySignal(SIGFPE), reports("std::int32_t"));
+	EXPECT_EXIT(divide(0u), testing::KilledBySignal(SIGFPE), reports("std::uint32_t"));
+	EXPECT_EXIT(zoncore::utility::WrappingRemainder(1, 0), testing::KilledBySignal(SIGFPE), "");
+}
+
+TEST_F(ZeroDivisor, ReachesTheCallerAsTheReporterRaisesIt)
+{
+	zoncore::config::SetErrorReporter({});
+	TickTime time(5);
+	EXPECT_THROW(time /= 0, zoncore::config::Error);
+	EXPECT_EQ(time, TickTime(5));
+	EXPECT_EQ(mReports.size(), 1u);
+}
+
+// ---- Text ------------------------------------------------------------------------------------------------------------
+
+TEST(TickTimeText, IsSeconds)
+{
+	const auto narrow = [](TickTime inTime, auto... inManipulators)
+	{
+		std::ostringstream stream;
+		((stream << inManipulators), ...);
+		stream << inTime;
+		return stream.str();
+	};
+	const auto wide = [](TickTime inTime, auto... inManipulators)
+	{
+		zoncore::oUTF16StringStream stream;
+		((stream << inManipulators), ...);
+		stream << inTime;
+		return zoncore::utility::UTF16to8(stream.str());
+	};
+	const TickTime third(kTicksPerSecond / 3);
+	for (const auto& [time, text] : std::to_array<std::pair<TickTime, const char*>>({
+			 {kTime_Zero, "0"},
+			 {TickTime(kTicksPerSecond), "1"},
+			 {TickTime(kTicksPerSecond) * 1.5, "1.5"},
+			 {third, "0.333333"},
+			 {kTime_Max, "360000"},
+			 {kTime_Invalid, "-400000"},
+			 {TickTime(kMost), "3.63102e+07"},
+			 {TickTime(1), "3.93676e-12"},
+		 }))
+	{
+		EXPECT_EQ(narrow(time), text);
+		EXPECT_EQ(wide(time), text);
+	}
+	EXPECT_EQ(narrow(third, std::setprecision(2), std::setfill('*'), std::setw(6)), "**0.33");
+	EXPECT_EQ(wide(third, std::setprecision(2), std::setw(10)), "  0.333333");
+	EXPECT_EQ(wide(third, std::setw(10), std::left), "0.333333  ");
+}
+
+}   // namespace
+}   // namespace zonmediatypes
