@@ -1,6 +1,6 @@
 #include "zoncore/NumberConversion.h"
 
-#include "AllocationCounter.h"
+#include "Allocations.h"
 #include "HostileLocale.h"
 #include "zoncore/StringUtils.h"
 

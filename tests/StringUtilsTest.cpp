@@ -1,5 +1,7 @@
 #include "zoncore/StringUtils.h"
 
+#include "Allocations.h"
+
 #include <gtest/gtest.h>
 
 #include <string>
@@ -160,6 +162,28 @@ TEST(ReplaceInString, TakesOneObjectForSeveralArguments)
 	EXPECT_EQ(UTF16to8(text), "nneww");
 	ReplaceInString(text, text, text);
 	EXPECT_EQ(UTF16to8(text), "nneww");
+}
+
+// Above the largest block of the pool, so that every allocation can fail in every build.
+TEST(StringUtils, GiveAllOrNothingWhenMemoryRunsOut)
+{
+	const std::string narrow(300, 'x');
+	const UTF16String wide = AsciiToUTF16(narrow), what = AsciiToUTF16("x"), with = AsciiToUTF16("yyy");
+	UTF16String text = wide;
+	EXPECT_GT(
+		zontest::FailEachAllocation([&] { ReplaceInString(text, what, with); }, [&] { ASSERT_EQ(text, wide); }), 0);
+	EXPECT_EQ(text, UTF16String(900, 'y'));
+
+	std::string result;
+	const auto expectAll = [&](const auto& inFunction)
+	{
+		EXPECT_GT(zontest::FailEachAllocation([&] { result = inFunction(); }, [] {}), 0);
+		EXPECT_EQ(result, narrow);
+	};
+	expectAll([&] { return std::string(UTF16to8(wide)); });
+	expectAll([&] { return UTF16to8(UTF8to16(narrow)); });
+	expectAll([&] { return UTF16to8(AsciiToUTF16(narrow)); });
+	expectAll([&] { return UTF16to8(Coercion(wide)); });
 }
 
 }   // namespace

@@ -49,6 +49,7 @@ template <class T>
 UTF16String Coercion(const T& inValue)
 {
 	oUTF16StringStream stream;
+	stream.exceptions(std::ios_base::badbit);   // memory that runs out is reported, not a text cut short
 	stream << inValue;
 	return stream.str();
 }
