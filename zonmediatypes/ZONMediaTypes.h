@@ -8,6 +8,7 @@
 #include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/PulldownCadenceUtils.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/TimeDisplayUtils.h"

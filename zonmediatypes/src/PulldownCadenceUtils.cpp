@@ -1,0 +1,82 @@
+#include "zonmediatypes/PulldownCadenceUtils.h"
+
+#include "zoncore/NumberConversion.h"
+#include "zoncore/WrappingArithmetic.h"
+
+#include <array>
+#include <cstddef>
+
+namespace zonmediatypes
+{
+namespace
+{
+
+constexpr std::int64_t kFilmFrames = 4;    // in a group
+constexpr std::int64_t kVideoFrames = 5;   // in the same group
+constexpr std::int64_t kMarked = 3;        // the marked position, counted from where the phase puts the group
+
+// The video frames of a group that carry the film frames, by phase; the one that is left out is the extra frame.
+constexpr auto sCarriers = std::to_array<std::array<std::int32_t, kFilmFrames>>({
+	{0, 1, 3, 4},
+	{0, 2, 3, 4},
+	{1, 2, 3, 4},
+	{0, 1, 2, 3},
+	{0, 1, 2, 4},
+});
+static_assert(sCarriers.size() == kVideoFrames);
+
+struct CadenceRow
+{
+	std::size_t mPhase;
+	bool mIsMarked;
+};
+
+constexpr auto sCadences = std::to_array<CadenceRow>({
+	{0, true},    // None
+	{1, true},    // WSSWW
+	{2, true},    // SSWWW
+	{3, true},    // SWWWS
+	{4, true},    // WWWSS
+	{0, true},    // WWSSW
+	{4, false},   // Advanced_WWWSW
+	{0, false},   // Advanced_WWSWW
+	{1, false},   // Advanced_WSWWW
+	{2, false},   // Advanced_SWWWW
+	{3, false},   // Advanced_WWWWS
+});
+static_assert(sCadences.size() == kPulldownCadence_Advanced_WWWWS + 1);
+
+constexpr CadenceRow FindCadence(PulldownCadence inCadence)
+{
+	const auto index = static_cast<std::size_t>(inCadence);   // a negative number is a very large one
+	return index < sCadences.size() ? sCadences[index] : sCadences[kPulldownCadence_None];
+}
+
+// 4/5 of a video rate, through double: exact to the tick at the rates that film is carried at.
+FrameRate FilmRate(FrameRate inVideoRate)
+{
+	constexpr auto kSecond = static_cast<double>(kTicksPerSecond);
+	if (inVideoRate == kFrameRate_Zero)
+		return kFrameRate_Zero;
+	const double framesPerSecond = kSecond / static_cast<double>(inVideoRate.GetTicksPerFrame()) * 4.0 / 5.0;
+	return FrameRate(zoncore::utility::TruncateTo<std::int64_t>(kSecond / framesPerSecond));
+}
+
+}   // namespace
+
+TickTime MapPulldownFrameTo2997Frame(
+	TickTime inTime, FrameRate inVideoRate, PulldownCadence inCadence, bool& outFlag) noexcept
+{
+	const std::int64_t filmFrame = inTime.ToFrame32(FilmRate(inVideoRate));
+	const std::int64_t inGroup = (filmFrame % kFilmFrames + kFilmFrames) % kFilmFrames;   // [0, 3]
+	const std::int64_t group = (filmFrame - inGroup) / kFilmFrames;
+	const CadenceRow cadence = FindCadence(inCadence);
+	const std::int64_t carrier = sCarriers[cadence.mPhase][static_cast<std::size_t>(inGroup)];
+	const std::int64_t videoFrame = group * kVideoFrames + carrier;
+
+	const std::int64_t position = (carrier + static_cast<std::int64_t>(cadence.mPhase)) % kVideoFrames;
+	outFlag = cadence.mIsMarked && videoFrame > 0 && position == kMarked;
+	return TickTime(zoncore::utility::WrappingMultiply(videoFrame, inVideoRate.GetTicksPerFrame()));
+}
+
+}   // namespace zonmediatypes
