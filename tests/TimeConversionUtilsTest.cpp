@@ -1,45 +1,20 @@
 #include "zonmediatypes/TimeConversionUtils.h"
 
+#include "AllocationCounter.h"
 #include "zoncore/Debug.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
 
 #include <atomic>
 #include <cmath>
-#include <cstdlib>
 #include <functional>
 #include <gtest/gtest.h>
 #include <limits>
-#include <new>
 #include <random>
 #include <string>
 #include <string_view>
 #include <utility>
 #include <vector>
-
-namespace
-{
-
-std::size_t sAllocations;
-
-}   // namespace
-
-// Counts what the library asks of the heap; blocks of a pool show under the sanitizers, where the pool is off.
-[[gnu::noinline]] void* operator new(std::size_t inSize)
-{
-	++sAllocations;
-	if (void* const block = std::malloc(inSize))
-		return block;
-	throw std::bad_alloc();
-}
-[[gnu::noinline]] void operator delete(void* inBlock) noexcept
-{
-	std::free(inBlock);
-}
-[[gnu::noinline]] void operator delete(void* inBlock, std::size_t) noexcept
-{
-	std::free(inBlock);
-}
 
 namespace zonmediatypes::utility
 {
@@ -753,17 +728,17 @@ TEST(Conversions, AllocateNothingButTheirText)
 	text.reserve(100);
 	const UTF16String longText = AsciiToUTF16("1:2." + std::string(100'000, '7') + ":3");
 	std::int64_t samples = 0;
-	const std::size_t before = sAllocations;
-	for (unsigned format = 0; format <= 15; ++format)
+	const auto convert = [&](TimecodeFormat inFormat)
 	{
-		ConvertSamplesToTimecode(text, 123'456'789, 48'000, static_cast<TimecodeFormat>(format), 30, &beats, false);
-		for (const std::int32_t ticks : {-1, 960})
-		{
-			beats.iTicksPerBeat = ticks;
-			ConvertTimecodeToSamples(samples, longText, static_cast<TimecodeFormat>(format), 48'000, 30, &beats, false);
-		}
+		ConvertSamplesToTimecode(text, 123'456'789, 48'000, inFormat, 30, &beats, false);
+		ConvertTimecodeToSamples(samples, longText, inFormat, 48'000, 30, &beats, false);
+	};
+	for (const std::int32_t ticks : {-1, 960})
+	{
+		beats.iTicksPerBeat = ticks;
+		for (unsigned format = 0; format <= 15; ++format)
+			EXPECT_EQ(zontest::CountAllocations([&] { convert(static_cast<TimecodeFormat>(format)); }), 0u) << format;
 	}
-	EXPECT_EQ(sAllocations, before);
 }
 
 }   // namespace

@@ -9,6 +9,8 @@
 
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/Export.h"
+#include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/TimeDisplayUtils.h"
 
 #include <span>
 #include <string_view>
@@ -17,6 +19,13 @@ namespace zonmediatypes
 {
 
 // ---- Time ------------------------------------------------------------------------------------------------------------
+
+/// The rate with its unit: "48000Hz" for a rate of 8,000 Hz and above, "29.97fps" for every slower one, "0fps" for
+/// kFrameRate_Zero. A duration of 0 and below counts as an audio rate: "infHz", "-29.97Hz".
+ZONMEDIATYPES_API zoncore::UTF16String FrameRateDescription(FrameRate inRate);
+
+/// The name of a display: "29.97 fps Drop-Frame Timecode"; empty for kTimeDisplay_Auto.
+ZONMEDIATYPES_API zoncore::UTF16String TimeDisplayDescription(TimeDisplay inDisplay);
 
 // ---- Audio -----------------------------------------------------------------------------------------------------------
 

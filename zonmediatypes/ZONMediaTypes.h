@@ -6,6 +6,7 @@
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/AudioChannelMap.h"
 #include "zonmediatypes/AudioFormat.h"
+#include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
