@@ -8,6 +8,7 @@
 /// lock of this library and may be called from any thread.
 
 #include "zoncore/UTF16String.h"
+#include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
@@ -28,6 +29,29 @@ ZONMEDIATYPES_API zoncore::UTF16String FrameRateDescription(FrameRate inRate);
 ZONMEDIATYPES_API zoncore::UTF16String TimeDisplayDescription(TimeDisplay inDisplay);
 
 // ---- Audio -----------------------------------------------------------------------------------------------------------
+
+/// The full name of a label ("Left Surround"), or the form with "&" before the accelerator of a menu ("L&eft Surround").
+/// `Discrete` is "Mono".
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelDescription(AudioChannelLabel inLabel, bool inWithMnemonic);
+
+/// The short form of a label ("Ls"). `Discrete` is "*" in every language.
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviations(AudioChannelLabel inLabel);
+
+/// The short form of a label in English, never translated.
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviationsUnlocalized(AudioChannelLabel inLabel);
+
+/// One line for a layout: "Mono" and "6 Channels" without labels; "Stereo", "5.1 (L, R, C, LFE, Ls, Rs)" and
+/// "SMPTE DTV (L R C LFE Ls Rs Lt Rt)" for well-known ones, of which only 5.1 is known in any order; for others their
+/// labels, "4 Channels (L R Ls Rs)", of which more than eight channels show the first seven,
+/// "24 Channels (L R C LFE Ls Rs Lc...)". A number that names no label shows as nothing: "1 Channel ()".
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescription(const AudioChannelLayout& inLayout);
+
+/// The untranslated abbreviations of all channels, each with a comma behind it, also the last: "L,R,". For machines.
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescriptionUnlocalized(const AudioChannelLayout& inLayout);
+
+/// One line for all streams of a clip: a layout's description for a single one, "3 x Stereo" for equal ones, "Stereo + Mono"
+/// for two that differ, "3 Audio Streams" for more, "(No Audio Streams)". Channels in another order make another layout.
+ZONMEDIATYPES_API zoncore::UTF16String AudioChannelConfigurationDescription(const AudioChannelLayouts& inStreams);
 
 // ---- Video -----------------------------------------------------------------------------------------------------------
 

@@ -7,7 +7,6 @@
 #include <cstddef>
 #include <cstdint>
 #include <functional>
-#include <ranges>
 #include <span>
 #include <string_view>
 
@@ -106,6 +105,12 @@ constexpr const AudioChannelLabelRow* FindLabelRow(AudioChannelLabel inLabel) no
 	const std::size_t index = LabelIndex(inLabel);
 	const std::size_t row = index < kLabelRows.size() ? kLabelRows[index] : 0;
 	return row != 0 ? &kAudioChannelLabels[row] : nullptr;
+}
+
+/// The index of a row of the table.
+constexpr std::size_t IndexOf(const AudioChannelLabelRow& inRow) noexcept
+{
+	return static_cast<std::size_t>(&inRow - kAudioChannelLabels.data());
 }
 
 }   // namespace zonmediatypes
