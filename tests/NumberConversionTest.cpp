@@ -64,6 +64,14 @@ std::string Format(
 	return UTF16to8(NumberToString(inValue, inDigits, inDecimals, inFlags, inLength));
 }
 
+TEST(IntegerToString, WritesEveryDigit)
+{
+	EXPECT_EQ(UTF16to8(IntegerToString(0)), "0");
+	EXPECT_EQ(UTF16to8(IntegerToString(-42)), "-42");
+	EXPECT_EQ(UTF16to8(IntegerToString(std::numeric_limits<std::int64_t>::min())), "-9223372036854775808");
+	EXPECT_EQ(UTF16to8(IntegerToString(std::numeric_limits<std::uint64_t>::max())), "18446744073709551615");
+}
+
 TEST(NumberToString, WritesFixedNotation)
 {
 	struct Case

@@ -7,7 +7,9 @@
 #include "zoncore/Flags.h"
 #include "zoncore/UTF16String.h"
 
+#include <array>
 #include <boost/rational.hpp>
+#include <charconv>
 #include <concepts>
 #include <cstdint>
 #include <limits>
@@ -38,6 +40,14 @@ inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
 /// Counts of any size are legal: text that no memory holds is longer than inMaxLength. The result is what is allocated.
 ZONCORE_API UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, unsigned long inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength);
+
+/// inValue in decimal digits, with "-" before a negative one.
+template <std::integral Integer>
+UTF16String IntegerToString(Integer inValue)
+{
+	std::array<char, std::numeric_limits<Integer>::digits10 + 2> text;   // with the last digit and a sign
+	return UTF16String(text.data(), std::to_chars(text.data(), text.data() + text.size(), inValue).ptr);
+}
 
 /// Reads the longest number at the start of inText: ASCII white space, an optional sign, decimal digits; for a double
 /// also "." with more digits and an exponent that has digits. What follows is ignored. False, and 0, when there are no
