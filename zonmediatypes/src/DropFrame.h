@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 
 namespace zonmediatypes
@@ -33,21 +34,25 @@ struct HMSF
 	friend constexpr bool operator==(const HMSF&, const HMSF&) noexcept = default;
 };
 
-/// Splits a frame count when every second has inNominal labels, at least one. Hours wrap at 24.
+/// Splits a frame count when every second has inNominal labels, at least one; up to 2^32 seconds. Hours wrap at 24.
 constexpr HMSF SplitFrames(std::uint64_t inFrames, std::uint64_t inNominal) noexcept
 {
-	const std::uint64_t seconds = inFrames / inNominal;
-	return {static_cast<std::uint32_t>(seconds / 3'600 % 24), static_cast<std::uint32_t>(seconds / 60 % 60),
-		static_cast<std::uint32_t>(seconds % 60), inFrames % inNominal};
+	// Remainders are made from their quotients: compilers divide again for `%`.
+	const auto seconds = static_cast<std::uint32_t>(inFrames / inNominal);
+	const std::uint32_t minutes = seconds / 60;
+	const std::uint32_t hours = minutes / 60;
+	return {
+		hours < 24 ? hours : hours % 24, minutes - 60 * hours, seconds - 60 * minutes, inFrames - inNominal * seconds};
 }
 
 /// Splits a frame count into drop-frame labels: puts the dropped ones back, then splits as usual. Hours wrap at 24.
 constexpr HMSF SplitDropFrames(std::uint64_t inFrames, DropFrameCount inCount) noexcept
 {
 	const std::uint64_t tens = inFrames / inCount.PerTenMinutes();
-	const std::uint64_t rest = inFrames % inCount.PerTenMinutes();
+	const std::uint64_t rest = inFrames - inCount.PerTenMinutes() * tens;
+	// The first minute is longer by the labels that each other drops: without its first frames all ten are equally long.
 	const std::uint64_t shortMinutes   // [0, 9]
-		= rest < inCount.PerFullMinute() ? 0 : (rest - inCount.PerFullMinute()) / inCount.PerShortMinute() + 1;
+		= (std::max(rest, inCount.mDropped) - inCount.mDropped) / inCount.PerShortMinute();
 	return SplitFrames(inFrames + inCount.mDropped * (9 * tens + shortMinutes), inCount.mNominal);
 }
 static_assert(SplitDropFrames(1'800, kDropFrame_2997) == HMSF{0, 1, 0, 2});

@@ -46,7 +46,8 @@ template <TimeDisplay inDisplay>
 HMSF FixedRateFields(TickTime inTime)
 {
 	constexpr const TimeDisplayRow& kRow = FindTimeDisplay(inDisplay);
-	const std::uint64_t frames = Magnitude(inTime.GetTicks() / kRow.mRate.GetTicksPerFrame());
+	const std::uint64_t frames
+		= Magnitude(inTime.GetTicks()) / static_cast<std::uint64_t>(kRow.mRate.GetTicksPerFrame());
 	if constexpr (kRow.mNumbering == FrameNumbering::Drop)
 		return SplitDropFrames(frames, kRow.mCount);
 	else
@@ -133,26 +134,25 @@ HMSF CarryFrames(HMSF inFields, FrameRate inRate)
 		inFields.mFrames - carry * static_cast<std::uint64_t>(TruncateTo<std::int64_t>(nominal))};
 }
 
-// Brings minutes and seconds below 60 and hours below 24.
+// Brings minutes and seconds below 60 and hours below 24, where they mostly are.
 HMSF CarrySeconds(HMSF inFields)
 {
+	if (inFields.mSeconds < 60 && inFields.mMinutes < 60 && inFields.mHours < 24)
+		return inFields;
 	const std::uint32_t minutes = inFields.mMinutes + inFields.mSeconds / 60;
 	const std::uint32_t hours = inFields.mHours + minutes / 60;
 	return {hours % 24, minutes % 60, inFields.mSeconds % 60, inFields.mFrames};
 }
 
-// The first label of a short minute is dropped with the next one; it alone counts as the frame that the minute begins with.
-bool IsDroppedFirstLabel(HMSF inFields)
-{
-	return inFields.mMinutes % 10 != 0 && inFields.mSeconds == 0 && inFields.mFrames == 0;
-}
-
-// The number of the frame that has these labels; without dropped labels they count up without a gap.
+// The number of the frame that has these labels; without dropped labels they count up without a gap. The first label of a
+// short minute is dropped with the next one; it alone counts as the frame that the minute begins with.
 std::uint64_t FrameNumber(HMSF inFields, DropFrameCount inCount)
 {
 	const std::uint64_t minutes = inFields.mHours * std::uint64_t{60} + inFields.mMinutes;   // [0, 1439]
-	const std::uint64_t shortMinutes = minutes - minutes / 10 - (IsDroppedFirstLabel(inFields) ? 1 : 0);
-	return inCount.mNominal * (minutes * 60 + inFields.mSeconds) + inFields.mFrames - inCount.mDropped * shortMinutes;
+	const std::uint64_t shortMinutes = minutes - minutes / 10;
+	const bool isDroppedFirstLabel = minutes % 10 != 0 && inFields.mSeconds == 0 && inFields.mFrames == 0;
+	const std::uint64_t dropped = inCount.mDropped * (shortMinutes - (isDroppedFirstLabel ? 1 : 0));
+	return inCount.mNominal * (minutes * 60 + inFields.mSeconds) + inFields.mFrames - dropped;
 }
 
 std::uint64_t CallersRateFrameNumber(HMSF inFields, FrameRate inRate, bool inRoundsSum)
@@ -178,6 +178,22 @@ TickTime FieldsToTime(HMSF inFields, bool inNegative, FrameRate inRate, const Ti
 
 // ---- Time to text ----------------------------------------------------------------------------------------------------
 
+template <class Char>
+constexpr auto kDigitPairs = []
+{
+	std::array<std::array<Char, 2>, 100> pairs{};
+	for (std::size_t number = 0; number < pairs.size(); ++number)
+		pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
+	return pairs;
+}();
+
+// Writes two digits of a number below 100; the end of what was written.
+template <class Char>
+Char* WriteTwoDigits(std::uint64_t inNumber, Char* outText)
+{
+	return std::copy_n(kDigitPairs<Char>[inNumber].data(), 2, outText);
+}
+
 // A text under construction, in place: a sign, three fields with their separators and a 64-bit count fit.
 template <class Char>
 class TimecodeText
@@ -187,14 +203,10 @@ public:
 	std::size_t Size() const { return static_cast<std::size_t>(mEnd - mText.data()); }
 
 	void Put(char inChar) { *mEnd++ = static_cast<Char>(inChar); }
-
-	// At least two digits of a number below 100.
-	void PutTwoDigits(std::uint64_t inNumber) { mEnd = std::copy_n(kDigitPairs[inNumber].data(), 2, mEnd); }
+	void PutTwoDigits(std::uint64_t inNumber) { mEnd = WriteTwoDigits(inNumber, mEnd); }
 
 	void PutNumber(std::uint64_t inNumber, int inMinDigits)
 	{
-		if (inMinDigits == 2 && inNumber < 100)
-			return PutTwoDigits(inNumber);
 		std::array<Char, kMostDigits> digits;
 		Char* first = digits.data() + digits.size();
 		for (std::uint64_t rest = inNumber; rest != 0 || inMinDigits > 0; rest /= 10, --inMinDigits)
@@ -205,17 +217,53 @@ public:
 private:
 	static constexpr std::size_t kMostDigits = std::numeric_limits<std::uint64_t>::digits10 + 1;
 	static constexpr std::size_t kMostChars = 1 + 3 * 3 + kMostDigits;
-	static constexpr auto kDigitPairs = []
-	{
-		std::array<std::array<Char, 2>, 100> pairs{};
-		for (std::size_t number = 0; number < pairs.size(); ++number)
-			pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
-		return pairs;
-	}();
 
 	std::array<Char, kMostChars> mText;
 	Char* mEnd = mText.data();
 };
+
+// The fields as they are shown: of a negative time without a sign the hours run backwards.
+HMSF ShownFields(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
+{
+	HMSF fields = FieldsOf(inTime, inRate, inDisplay);
+	if (inTime < kTime_Zero && !inFlags.Test(kTimecodeFlag_ShowSign))
+		fields.mHours = 23 - fields.mHours;
+	return fields;
+}
+
+constexpr char FrameSeparator(const TimeDisplayRow& inRow)
+{
+	if (inRow.mNumbering == FrameNumbering::Drop)
+		return ';';
+	return inRow.mKind == DisplayKind::Milliseconds ? '.' : ':';
+}
+
+// ---- Time to text: the usual form --------------------------------------------------------------------------------------
+
+// Four fields of two digits: nearly all text has this form. Its length is known before it is written, so that it is written
+// where it stays.
+constexpr std::size_t kUsualLength = 11;
+
+bool HasUsualText(const TimeDisplayRow& inRow, TimecodeFlags inFlags)
+{
+	constexpr TimecodeFlags kOtherForms
+		= kTimecodeFlag_OmitHours | kTimecodeFlag_TrimLeadingZeros | kTimecodeFlag_ShowSign;
+	return inRow.mKind == DisplayKind::Timecode && (inFlags & kOtherForms) == TimecodeFlags();
+}
+
+template <class Char>
+void WriteUsualText(HMSF inFields, char inFrameSeparator, Char* outText)
+{
+	WriteTwoDigits(inFields.mHours, outText);
+	outText[2] = ':';
+	WriteTwoDigits(inFields.mMinutes, outText + 3);
+	outText[5] = ':';
+	WriteTwoDigits(inFields.mSeconds, outText + 6);
+	outText[8] = static_cast<Char>(inFrameSeparator);
+	WriteTwoDigits(inFields.mFrames, outText + 9);
+}
+
+// ---- Time to text: all forms ---------------------------------------------------------------------------------------------
 
 // How many digits the frames field has at least: those of the largest frame number, up to five and with some room for
 // rates that are just above a power of ten.
@@ -253,8 +301,7 @@ void PutFields(
 		putBeforeColon(inFields.mHours);
 	putBeforeColon(inFields.mMinutes);
 	put(inFields.mSeconds);
-	const bool isDrop = inRow.mNumbering == FrameNumbering::Drop;
-	ioText.Put(isDrop ? ';' : inRow.mKind == DisplayKind::Milliseconds ? '.' : ':');
+	ioText.Put(FrameSeparator(inRow));
 	ioText.PutNumber(inFields.mFrames, inFrameDigits);
 }
 
@@ -283,19 +330,16 @@ void PutTimecode(
 {
 	const TimeDisplayRow& row = FindTimeDisplay(inDisplay);
 	const bool showsSign = inFlags.Test(kTimecodeFlag_ShowSign);
-	const bool isNegative = inTime < kTime_Zero;
 	if (showsSign && inTime > kTime_Zero)
 		ioText.Put('+');
 	if (row.mKind == DisplayKind::Frames)
 		return PutFrameCount(ioText, inTime.ToFrame64(inRate));
 	if (row.mKind == DisplayKind::Film)
 		return PutFeet(ioText, inTime, inRate, row.mFramesPerFoot);
-	if (showsSign && isNegative)
+	if (showsSign && inTime < kTime_Zero)
 		ioText.Put('-');
-	HMSF fields = FieldsOf(inTime, inRate, inDisplay);
-	if (isNegative && !showsSign)
-		fields.mHours = 23 - fields.mHours;
-	PutFields(ioText, fields, row, FrameDigits(row, row.CountsAtCallersRate() ? inRate : row.mRate), inFlags);
+	const int frameDigits = FrameDigits(row, row.CountsAtCallersRate() ? inRate : row.mRate);
+	PutFields(ioText, ShownFields(inTime, inRate, inDisplay, inFlags), row, frameDigits, inFlags);
 }
 
 // ---- Text to time ----------------------------------------------------------------------------------------------------
@@ -332,6 +376,26 @@ struct TextFields
 	HMSF mFields{};
 	int mGroups = 1;
 };
+
+// Text in its usual form, read without a branch for every character. False for all other text.
+bool ReadUsualFields(UTF16StringView inText, TextFields& outFields)
+{
+	if (inText.size() != kUsualLength || !IsSeparator(inText[2]) || !IsSeparator(inText[5]) || !IsSeparator(inText[8]))
+		return false;
+	bool isNumber = true;
+	const auto read = [&](std::size_t inAt)
+	{
+		const std::uint32_t tens = inText[inAt] - std::uint32_t{'0'};
+		const std::uint32_t ones = inText[inAt + 1] - std::uint32_t{'0'};
+		isNumber &= tens < 10;
+		isNumber &= ones < 10;
+		return tens * 10 + ones;
+	};
+	const TextFields fields{{read(0), read(3), read(6), read(9)}, 4};
+	if (isNumber)
+		outFields = fields;
+	return isNumber;
+}
 
 // False for a text that is not one to four groups of digits, with single separators between them.
 bool ReadFields(UTF16StringView inText, TextFields& outFields)
@@ -378,7 +442,7 @@ TickTime ReadTimecode(UTF16StringView inText, FrameRate inRate, const TimeDispla
 	const bool hasLeadingSeparator = !magnitude.empty() && IsSeparator(magnitude.front());
 	const UTF16StringView groups = magnitude.substr(hasLeadingSeparator ? 1 : 0);
 	TextFields read;
-	if (groups.empty() || !ReadFields(groups, read))
+	if (groups.empty() || (!ReadUsualFields(groups, read) && !ReadFields(groups, read)))
 		return kTime_Invalid;
 	const bool isCount = inRow.mKind == DisplayKind::Frames;
 	if (isCount && read.mGroups != 1)
@@ -452,8 +516,16 @@ TickTime HMSFToTime(unsigned int inHours, unsigned int inMinutes, unsigned int i
 UTF16String TimeToTimecode(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
 {
 	const TickTime time = inFlags.Test(kTimecodeFlag_LastFrame) ? MovedByFrames(inTime, -1, inRate) : inTime;
+	const TimeDisplay display = ChooseDisplay(inDisplay, inRate);
+	const TimeDisplayRow& row = FindTimeDisplay(display);
+	if (HasUsualText(row, inFlags))
+	{
+		UTF16String text(kUsualLength, UTF16Char{});
+		WriteUsualText(ShownFields(time, inRate, display, inFlags), FrameSeparator(row), text.data());
+		return text;
+	}
 	TimecodeText<UTF16Char> text;
-	PutTimecode(text, time, inRate, ChooseDisplay(inDisplay, inRate), inFlags);
+	PutTimecode(text, time, inRate, display, inFlags);
 	return UTF16String(text.Data(), text.Size());
 }
 
