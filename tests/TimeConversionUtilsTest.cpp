@@ -1,6 +1,6 @@
 #include "zonmediatypes/TimeConversionUtils.h"
 
-#include "AllocationCounter.h"
+#include "Allocations.h"
 #include "zoncore/Debug.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
@@ -739,6 +739,16 @@ TEST(Conversions, AllocateNothingButTheirText)
 		for (unsigned format = 0; format <= 15; ++format)
 			EXPECT_EQ(zontest::CountAllocations([&] { convert(static_cast<TimecodeFormat>(format)); }), 0u) << format;
 	}
+}
+
+TEST(Conversions, LeaveTheTextAloneWhenMemoryRunsOut)
+{
+	const UTF16String before = AsciiToUTF16("before");
+	UTF16String text = before;
+	zontest::FailEachAllocation(
+		[&] { ConvertSamplesToTimecode(text, 123'456'789, 48'000, kTimecodeFormat_Timecode, 30, nullptr, false); },
+		[&] { EXPECT_EQ(text, before); });
+	EXPECT_EQ(UTF16to8(text), "00:42:52:00");
 }
 
 }   // namespace

@@ -75,22 +75,32 @@ struct BeatInfo
 /// inNTSC scales the rate by 1000/1001. inDropFrame reads drop-frame labels, where the dropped labels at the start of a
 /// minute stand for the first one that exists; it does not itself imply inNTSC. Empty text is -1, text without digits and
 /// a frame rate of 0 give 0. Always true.
-ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UTF16String& inTimecode,
-	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame);
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inTimecode,
-	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame);
+	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame) noexcept;
+
+inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UTF16String& inTimecode,
+	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame) noexcept
+{
+	return ConvertTimecodeToSamples(
+		outSamples, zoncore::UTF16StringView(inTimecode), inSampleRate, inFrameRate, inNTSC, inDropFrame);
+}
 
 /// Text of any format as a position. Empty text is -1, meaning no value; None and unknown formats are 0. Text in Decimal,
 /// Beats and Milliseconds is read as timecode one place to the left, so that "1:30" is 90 s (or beats, or milliseconds),
 /// "1:00:00" is an hour and "1:00:00:00" deliberately loses its hours; the result is rounded to the nearest sample.
 /// inBeatInfo is needed for Beats and BarsAndBeats only, inIsDuration matters for BarsAndBeats only.
 /// False, and outSamples untouched, when a BeatInfo is needed and missing.
-ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UTF16String& inText,
-	TimecodeFormat inFormat, std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo,
-	bool inIsDuration);
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inText,
 	TimecodeFormat inFormat, std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo,
 	bool inIsDuration);
+
+inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UTF16String& inText,
+	TimecodeFormat inFormat, std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo,
+	bool inIsDuration)
+{
+	return ConvertTimecodeToSamples(
+		outSamples, zoncore::UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
+}
 
 /// Bars-and-beats text as a position, rounded to the nearest sample: bar, ":", beat, and optionally "." and ticks, as in
 /// "5:3.120"; text without ":" is a bar alone. With iTicksPerBeat -1 what follows "." is a decimal fraction of a beat.
@@ -99,9 +109,13 @@ ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncor
 /// As a position bars and beats count from 1 and the first bar begins at dOffsetMilliseconds; as a duration they count
 /// from 0. A tempo, beat value or tick count of 0 has no meaningful result.
 ZONMEDIATYPES_API std::int64_t ConvertBarsAndBeatsToSamples(
-	const zoncore::UTF16String& inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration);
-ZONMEDIATYPES_API std::int64_t ConvertBarsAndBeatsToSamples(
-	zoncore::UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration);
+	zoncore::UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration) noexcept;
+
+inline std::int64_t ConvertBarsAndBeatsToSamples(
+	const zoncore::UTF16String& inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration) noexcept
+{
+	return ConvertBarsAndBeatsToSamples(zoncore::UTF16StringView(inText), inSampleRate, inBeatInfo, inIsDuration);
+}
 
 // ---- Samples to text -------------------------------------------------------------------------------------------------
 //
@@ -129,7 +143,7 @@ ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, s
 /// - inShowSubframes: "." and hundredths of a frame behind the frames.
 /// - inTotalMinutes: no hours; minutes count on, "62:05:00".
 ///
-/// Frames have as many digits as the largest frame number of the rate. The text is "0" for a sample rate of 0 or below, and
+/// Frames have as many digits as the largest frame number of the rate, up to four. The text is "0" for a sample rate of 0 or below, and
 /// for a frame rate below 1 (drop-frame: below 30) or whose frames per minute or hour are 0 in 32 bits.
 ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, std::int64_t inSamples,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inDropFrame, bool inNTSC, bool inFrameCountOnly,

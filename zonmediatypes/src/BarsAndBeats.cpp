@@ -159,7 +159,7 @@ void AppendBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSa
 }   // namespace
 
 std::int64_t ConvertBarsAndBeatsToSamples(
-	UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration)
+	UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration) noexcept
 {
 	const double beats
 		= ReadWholeBeats(inText, inBeatInfo.iBeatsPerBar, inIsDuration) + ReadSubBeat(inText, inBeatInfo.iTicksPerBeat);
@@ -169,12 +169,6 @@ std::int64_t ConvertBarsAndBeatsToSamples(
 		return samples;
 	return WrappingAdd(
 		samples, TruncateTo<std::int64_t>(inSampleRate * inBeatInfo.dOffsetMilliseconds / 1'000.0 + 0.5));
-}
-
-std::int64_t ConvertBarsAndBeatsToSamples(
-	const UTF16String& inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration)
-{
-	return ConvertBarsAndBeatsToSamples(UTF16StringView(inText), inSampleRate, inBeatInfo, inIsDuration);
 }
 
 bool ConvertSamplesToBarsAndBeats(UTF16String& outText, double inSamples, double inSampleRate,

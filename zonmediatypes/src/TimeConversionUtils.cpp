@@ -2,7 +2,7 @@
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
-#include "zonmediatypes/src/DropFrameCount.h"
+#include "zonmediatypes/src/DropFrame.h"
 #include "zonmediatypes/src/SampleClock.h"
 
 #include <array>
@@ -355,7 +355,7 @@ void AppendSampleCount(PositionText& ioText, std::int64_t inSamples)
 }   // namespace
 
 bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inTimecode, std::int32_t inSampleRate,
-	std::int32_t inFrameRate, bool inNTSC, bool inDropFrame)
+	std::int32_t inFrameRate, bool inNTSC, bool inDropFrame) noexcept
 {
 	if (inTimecode.empty())
 	{
@@ -366,13 +366,6 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inTimeco
 	const std::int32_t frames = inDropFrame ? CountDropFrames(fields, inFrameRate) : CountFrames(fields, inFrameRate);
 	outSamples = FramesToSamples(frames, fields, inSampleRate, inFrameRate, inNTSC);
 	return true;
-}
-
-bool ConvertTimecodeToSamples(std::int64_t& outSamples, const UTF16String& inTimecode, std::int32_t inSampleRate,
-	std::int32_t inFrameRate, bool inNTSC, bool inDropFrame)
-{
-	return ConvertTimecodeToSamples(
-		outSamples, UTF16StringView(inTimecode), inSampleRate, inFrameRate, inNTSC, inDropFrame);
 }
 
 bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, TimecodeFormat inFormat,
@@ -430,13 +423,6 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 	}
 	outSamples = 0;   // deliberate for unknown formats, too
 	return true;
-}
-
-bool ConvertTimecodeToSamples(std::int64_t& outSamples, const UTF16String& inText, TimecodeFormat inFormat,
-	std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo, bool inIsDuration)
-{
-	return ConvertTimecodeToSamples(
-		outSamples, UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
 }
 
 bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate,
