@@ -745,8 +745,8 @@ TEST(Conversions, LeaveTheTextAloneWhenMemoryRunsOut)
 {
 	const UTF16String before = AsciiToUTF16("before");
 	UTF16String text = before;
-	zontest::FailEachAllocation(
-		[&] { ConvertSamplesToTimecode(text, 123'456'789, 48'000, kTimecodeFormat_Timecode, 30, nullptr, false); },
+	zontest::FailEachAllocation([&]
+		{ ConvertSamplesToTimecode(text, 123'456'789, 48'000, kTimecodeFormat_Timecode, 30, nullptr, false); },
 		[&] { EXPECT_EQ(text, before); });
 	EXPECT_EQ(UTF16to8(text), "00:42:52:00");
 }

@@ -7,12 +7,17 @@
 /// function does not know gives an empty text, and no key is looked up for it. Each function returns a new text, takes no
 /// lock of this library and may be called from any thread.
 
+#include "zoncore/Geometry.h"
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/PixelAspectRatio.h"
+#include "zonmediatypes/PixelFormat.h"
+#include "zonmediatypes/PixelFormatSelection.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 
+#include <cstdint>
 #include <span>
 #include <string_view>
 
@@ -54,6 +59,35 @@ ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescriptionUnlocalized(
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelConfigurationDescription(const AudioChannelLayouts& inStreams);
 
 // ---- Video -----------------------------------------------------------------------------------------------------------
+
+/// The order of the fields of interlaced video.
+enum FieldType : std::int32_t
+{
+	kFieldType_Invalid = -1,   ///< not known whether there are fields
+	kFieldType_NoFields = 0,   ///< progressive
+	kFieldType_UpperFirst = 1,
+	kFieldType_LowerFirst = 2,
+	kFieldType_UnknownDominance = 3,
+	kFieldType_Any = 4,
+};
+
+/// "Draft", "Low", "Medium", "High", "Max".
+ZONMEDIATYPES_API zoncore::UTF16String RenderQualityDescription(RenderQuality inQuality);
+
+/// "Upper Field First", "No Fields (Progressive Scan)".
+ZONMEDIATYPES_API zoncore::UTF16String FieldTypeDescription(FieldType inType);
+
+/// "BGRA 4444 8u", "VUYA 4444 32f 709", "NTSC DV 50", "YUV 420 MPEG2 Frame 8u Full Range". Formed from the properties:
+/// UYVY is "VUY 422 8u", YUYV "YUV 422 8u" and r210 "BGR 4444 10u". The name stands only in the texts of custom formats and
+/// of unknown compression, its characters from the last to the first (deliberate): "Custom Pixel Format (cba_)".
+ZONMEDIATYPES_API zoncore::UTF16String PixelFormatDescription(PixelFormat inFormat);
+
+/// The name of the first well-known shape that is equal under the tolerant comparison, with the ratio as a number:
+/// "D1/DV NTSC (0.9091)"; "Other Aspect Ratio (0.9000)" for every other one.
+ZONMEDIATYPES_API zoncore::UTF16String PixelAspectRatioDescription(PixelAspectRatio inRatio);
+
+/// "720w 480h (0.9091)", without the ratio when its numerator is 0. The width is `right` and the height `bottom`.
+ZONMEDIATYPES_API zoncore::UTF16String VideoFrameSizeDescription(zoncore::RectT<int> inFrame, PixelAspectRatio inRatio);
 
 // ---- Keys ------------------------------------------------------------------------------------------------------------
 

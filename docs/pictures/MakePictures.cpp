@@ -18,7 +18,6 @@ struct NamedPicture
 };
 
 constexpr auto sPictures = std::to_array<NamedPicture>({
-	{"cadences", pictures::DrawCadences},
 	{"channel-grid", pictures::DrawChannelGrid},
 	{"drop-frame", pictures::DrawDropFrame},
 });

@@ -1,0 +1,70 @@
+#pragma once
+
+/// \file
+/// Which pixel format frames travel in: what a conversion costs, and the choices made by it.
+///
+/// A producer offers formats, a consumer accepts formats. A conversion has a cost: 0 for none, a few points for what is
+/// cheap and loses nothing, 100 and more for what shows, 10000 for what cannot be done.
+///
+///     PixelConversionCost(kPixelFormat_BGRA_4444_8u.mProperties, kPixelFormat_BGRX_4444_8u.mProperties,
+///         kRenderQuality_High);                                                 // 26: alpha is lost
+///     Select4444PixelFormat(kPixelFormat_UYVY_422_8u, kRenderQuality_High);     // kPixelFormat_VUYX_4444_8u
+///
+/// Pure functions of their arguments, which take no lock, allocate nothing and throw nothing; the registry of custom
+/// formats is not asked. Lists may be empty, may repeat formats, and may hold invalid, custom and wildcard ones.
+
+#include "zoncore/SmallBlockAllocator.h"
+#include "zonmediatypes/Export.h"
+#include "zonmediatypes/PixelFormat.h"
+
+#include <cstdint>
+
+namespace zonmediatypes
+{
+
+/// The quality at which the host renders. Rules compare it as a number: Medium and more is high, less is low.
+enum RenderQuality : std::int32_t
+{
+	kRenderQuality_Draft = 1,
+	kRenderQuality_Low = 2,
+	kRenderQuality_Medium = 3,
+	kRenderQuality_High = 4,
+	kRenderQuality_Max = 5,
+};
+
+/// A list of formats; in the order of preference where formats tie.
+using PixelFormats = zoncore::utility::SmallBlockAllocator::vector<PixelFormat>;
+
+/// The cost of a conversion that cannot be done, and the highest of all.
+inline constexpr int kPixelConversionCost_Impossible = 10'000;
+
+/// What it costs to convert frames: 0 for equal properties, kPixelConversionCost_Impossible into a compressed format and
+/// from and to what is not concrete. Changes that lose something cost more at high quality.
+ZONMEDIATYPES_API int PixelConversionCost(
+	const PixelFormatProperties& inFrom, const PixelFormatProperties& inTo, RenderQuality inQuality) noexcept;
+
+/// The format for frames between a producer of inSourceFormats and a consumer of inDestinationFormats: the request, when
+/// it is preferred and accepted; else a format that both know; else the cheapest conversion, of several the one nearest
+/// to the request; else a format that can be worked in. kPixelFormat_Invalid when there is none.
+///
+/// The result can be a format that the producer does not make, or the request although neither list names it: ask for the
+/// cost of getting there. Where kPixelFormat_Any is accepted, the cheapest conversion stands for its source format, and a
+/// tie for its destination format (deliberate).
+ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats,
+	PixelFormat inRequestedFormat, const PixelFormats& inDestinationFormats, RenderQuality inQuality,
+	bool inPreferRequested) noexcept;
+
+/// The source format that converts most cheaply to inTarget, of several the shallowest, of those the first; for the
+/// wildcard the first concrete one that is not custom. kPixelFormat_Invalid when there is none.
+ZONMEDIATYPES_API PixelFormat SelectNearestSourcePixelFormat(
+	const PixelFormats& inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
+
+/// The built-in format with full chroma and a fourth component in which frames of inFormat are processed: inFormat itself
+/// when it is one; else 8-bit for 8-bit, and for deeper ones 32-bit float at high quality and 8-bit at low. YUV of full
+/// range is processed as RGB. kPixelFormat_Any for the wildcard, kPixelFormat_Invalid when no format has these properties.
+ZONMEDIATYPES_API PixelFormat Select4444PixelFormat(PixelFormat inFormat, RenderQuality inQuality) noexcept;
+
+/// The uncompressed format that a DV format decompresses into; every other format as it is.
+ZONMEDIATYPES_API PixelFormat SelectDVDecompressionFormat(PixelFormat inFormat) noexcept;
+
+}   // namespace zonmediatypes
