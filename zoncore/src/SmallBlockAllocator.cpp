@@ -198,10 +198,13 @@ void* SmallBlockAllocator::Allocate(std::size_t inSize)
 	return ::operator new(inSize);
 }
 
-// The size goes along: a checking `operator delete` finds blocks that come back with another one.
-void SmallBlockAllocator::Dispose(void* inBlock, std::size_t inSize) noexcept
+void SmallBlockAllocator::Dispose(void* inBlock, [[maybe_unused]] std::size_t inSize) noexcept
 {
-	::operator delete(inBlock, inSize);
+	#if __cpp_sized_deallocation
+	::operator delete(inBlock, inSize);   // a checking one finds blocks that come back with another size
+	#else
+	::operator delete(inBlock);
+	#endif
 }
 
 #endif   // ZONCORE_SMALL_BLOCK_POOL
