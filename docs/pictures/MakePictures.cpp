@@ -18,6 +18,7 @@ struct NamedPicture
 };
 
 constexpr auto sPictures = std::to_array<NamedPicture>({
+	{"cadences", pictures::DrawCadences},
 	{"channel-grid", pictures::DrawChannelGrid},
 	{"drop-frame", pictures::DrawDropFrame},
 });
