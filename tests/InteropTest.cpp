@@ -1,8 +1,11 @@
+#include "zonmediatypes/interop/Fmt.h"
 #include "zonmediatypes/interop/Hash.h"
+#include "zonmediatypes/interop/Streams.h"
 #include "zonmediatypes/interop/Strings.h"
 
 #include <gmock/gmock.h>
 
+#include <iomanip>
 #include <unordered_map>
 #include <unordered_set>
 #include <vector>
@@ -72,6 +75,63 @@ TEST(Strings, ConvertBothWays)
 	const std::u16string lone(1, char16_t{0xD834});
 	EXPECT_EQ(ToU16String(FromU16String(lone)), lone);
 	EXPECT_EQ(ToUTF8(FromU16String(lone)), "\uFFFD");
+}
+
+// ---- Streams and fmt -------------------------------------------------------------------------------------------------
+
+template <class T>
+std::string Stream(const T& inValue)
+{
+	std::ostringstream stream;
+	stream << inValue;
+	return stream.str();
+}
+
+template <class T>
+void ExpectText(const T& inValue, const std::string& inText)
+{
+	EXPECT_EQ(Stream(inValue), inText);
+#ifdef FMT_VERSION
+	EXPECT_EQ(fmt::format("{}", inValue), inText);
+#endif
+}
+
+TEST(Streams, WriteEveryValue)
+{
+	ExpectText(TickTime(kTicksPerSecond * 3 / 2), "1.5");
+	ExpectText(kFrameRate_23976, "23.976");
+	ExpectText(kAudioChannelLabel_BackLeft, "Ls");
+	ExpectText(kAudioChannelLabel_Discrete, "*");
+	ExpectText(static_cast<AudioChannelLabel>(120), "label 120");
+	ExpectText(AudioChannelDescription(kAudioChannelLabel_LFE2), "LFE2");
+	ExpectText(CreateBroadcast51ChannelLayout(), "L R C LFE Ls Rs");
+	ExpectText(AudioChannelLayout(), "no channels");
+	ExpectText(AudioFormat::CreateDefaultAudioFormat(2, 48'000), "48000 Hz, 32 bits, L R");
+	ExpectText(AudioFormat(), "0 Hz, 0 bits, no channels");
+	ExpectText(PointT<int>{1'920, -1}, "(1920, -1)");
+	ExpectText(RectT<int>{0, 1, 1'920, 1'080}, "(0, 1, 1920, 1080)");
+	ExpectText(zoncore::Flags<unsigned char>(0x1B), "0x1b");
+	EXPECT_EQ(Stream(FromUTF8("Länge")), "Länge");
+	ExpectText(
+		utility::BeatInfo{
+			.iTicksPerBeat = -1, .dTempo = 92.5, .iBeatsPerBar = 6, .iBeatValue = 8, .dOffsetMilliseconds = 0},
+		"92.5 in 6/8, -1 ticks a beat, from 0 ms");
+}
+
+TEST(Streams, WriteChannelMaps)
+{
+	ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
+	ExpectText(map, "L -> 0, R -> 1");
+	map.AddChannel(CreateQuadraphonicChannelLayout(), -1);
+	ExpectText(map, "L -> 0, R -> 1, L R Ls Rs -> none");
+	ExpectText(ChannelMap(), "no entries");
+}
+
+TEST(Streams, PadTheWholeText)
+{
+	std::ostringstream stream;
+	stream << std::setw(12) << std::setfill('.') << PointT<int>{1, 2} << std::setw(5) << CreateStereoChannelLayout();
+	EXPECT_EQ(stream.str(), "......(1, 2)..L R");
 }
 
 }   // namespace
