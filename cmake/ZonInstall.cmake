@@ -38,6 +38,11 @@ foreach(library IN ITEMS zoncore zonmediatypes)
 	install(FILES "${generated}/${library}.pc" DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig" COMPONENT development)
 endforeach()
 
+# gdb loads what lies here under the path of a library when it meets the library.
+install(FILES "${zonmediatypes_SOURCE_DIR}/tools/gdb/zonmediatypes.py"
+	DESTINATION "${CMAKE_INSTALL_DATADIR}/gdb/auto-load${CMAKE_INSTALL_FULL_LIBDIR}"
+	RENAME "libzonmediatypes.so.${zonmediatypes_VERSION}-gdb.py" COMPONENT development)
+
 if(TARGET zonmedia)
 	file(RELATIVE_PATH librariesFromPrograms "/prefix/${CMAKE_INSTALL_BINDIR}" "/prefix/${CMAKE_INSTALL_LIBDIR}")
 	set_target_properties(zonmedia PROPERTIES INSTALL_RPATH "$ORIGIN/${librariesFromPrograms}")

@@ -3,7 +3,7 @@
     (gdb) print mark
     $1 = 60.06 s (15256200960000 ticks)
     (gdb) print layout
-    $2 = std::vector of length 2, capacity 2 = {L FrontLeft...
+    $2 = std::vector of length 2, capacity 2 = {FrontLeft, FrontRight}
 
 An installed library brings this file where gdb loads it on its own; elsewhere: source tools/gdb/zonmediatypes.py
 """
@@ -11,6 +11,7 @@ An installed library brings this file where gdb loads it on its own; elsewhere: 
 import re
 
 import gdb
+import gdb.types
 
 TICKS_PER_SECOND = 254016000000
 NO_RATE = 2**63 - 1
@@ -119,8 +120,6 @@ def register(objfile):
     if find_printer not in objfile.pretty_printers:
         objfile.pretty_printers.insert(0, find_printer)
 
-
-import gdb.types  # noqa: E402
 
 for loaded in gdb.objfiles():
     register(loaded)
