@@ -57,7 +57,7 @@ public:
 		using Unsigned = std::make_unsigned_t<Integer>;
 		const auto kind = Any<std::uint8_t>();
 		if (kind < 0x80)
-			return Any<std::int8_t>();
+			return static_cast<Integer>(Any<std::int8_t>());
 		if (kind < 0xC0)
 			return Any<Integer>();
 		const auto bit = static_cast<Unsigned>(Unsigned{1} << kind % std::numeric_limits<Unsigned>::digits);
