@@ -9,12 +9,15 @@
 
 #include <functional>
 #include <initializer_list>
+#include <memory>
 #include <span>
 #include <string_view>
 #include <utility>
 
 namespace zoncore::config
 {
+
+class MessageCatalogue;
 
 /// Receives the whole key, "=" and English text included. True: outText, empty at first, is the translation. False, or an
 /// exception: the key has none, and what was written to outText is discarded. It is called with no lock held, from any
@@ -27,13 +30,17 @@ class ZONCORE_API Localizer
 public:
 	static Localizer& Get() noexcept;
 
-	/// The translation of inKey, or the English text behind its first "=" (UTF-8) when there is none; a key without "="
-	/// has an empty one. Costs one atomic load and the text when no translator is installed. Safe on any thread.
+	/// The translation of inKey by the translator, else by the catalogue, else the English text behind its first "="
+	/// (UTF-8); a key without "=" has an empty one. Costs two atomic loads and the text when neither is installed. Safe on
+	/// any thread.
 	UTF16String Lookup(std::string_view inKey) const;
 
 	/// Installs inTranslator; an empty one removes it. Safe while other threads look up: a look-up that has begun ends
 	/// with the translator it began with.
 	void SetTranslator(Translator inTranslator);
+
+	/// Installs a catalogue for the keys that the translator does not know; null removes it. As safe as SetTranslator.
+	void SetCatalogue(const std::shared_ptr<const MessageCatalogue>& inCatalogue);
 
 private:
 	Localizer() = default;

@@ -9,9 +9,62 @@
 namespace zoncore
 {
 
-/// A function that the host may replace at any time, from any thread. Callers hold the function that they found for as
-/// long as they use it, and no lock while they call it. An empty function costs its users one atomic load. Instances are
-/// constant-initialised and never destroyed: they serve static objects to the end of the process.
+/// An immutable value that may be replaced at any time, from any thread. Users hold the value that they found for as long
+/// as they need it, and no lock meanwhile. To find none costs one atomic load. Instances are constant-initialised and never
+/// destroyed: they serve static objects to the end of the process.
+template <class Value>
+class Replaceable
+{
+public:
+	using Pointer = std::shared_ptr<const Value>;
+
+	constexpr Replaceable() : mState() {}
+	Replaceable(const Replaceable&) = delete;
+	Replaceable& operator=(const Replaceable&) = delete;
+	~Replaceable() {}   // deliberately leaves mState alone
+
+	/// The current value; null when there is none.
+	Pointer Get() const
+	{
+		if (!mState.mIsThere.load(std::memory_order_acquire))
+			return {};
+		const std::lock_guard lock(mState.mMutex);
+		return mState.mValue;
+	}
+
+	/// Stores inNext, null for none.
+	void Set(const Pointer& inNext)
+	{
+		while (!ReplaceIfStill(Get(), inNext))
+			continue;
+	}
+
+	/// Stores inNext unless the value is no longer inPrevious, which the caller holds: what the host gave is copied and
+	/// destroyed without the lock.
+	bool ReplaceIfStill(const Pointer& inPrevious, const Pointer& inNext)
+	{
+		const std::lock_guard lock(mState.mMutex);
+		if (mState.mValue != inPrevious)
+			return false;
+		mState.mValue = inNext;
+		mState.mIsThere.store(inNext != nullptr, std::memory_order_release);
+		return true;
+	}
+
+private:
+	struct State
+	{
+		std::atomic<bool> mIsThere = false;
+		mutable std::mutex mMutex;
+		Pointer mValue;
+	};
+	union
+	{
+		State mState;
+	};
+};
+
+/// A function that the host may replace.
 template <class Signature>
 class Hook
 {
@@ -19,19 +72,8 @@ public:
 	using Function = std::function<Signature>;
 	using Pointer = std::shared_ptr<const Function>;
 
-	constexpr Hook() : mState() {}
-	Hook(const Hook&) = delete;
-	Hook& operator=(const Hook&) = delete;
-	~Hook() {}   // deliberately leaves mState alone
-
 	/// The installed function; null when there is none.
-	Pointer Get() const
-	{
-		if (!mState.mIsInstalled.load(std::memory_order_acquire))
-			return {};
-		const std::lock_guard lock(mState.mMutex);
-		return mState.mFunction;
-	}
+	Pointer Get() const { return mFunction.Get(); }
 
 	/// Installs inFunction and returns a copy of the one before it. When copying throws, nothing has changed.
 	Function Exchange(Function inFunction)
@@ -41,18 +83,13 @@ public:
 		{
 			const Pointer previous = Get();
 			Function copy = previous ? *previous : Function();
-			if (ReplaceIfStill(previous, next))
+			if (mFunction.ReplaceIfStill(previous, next))
 				return copy;
 		}
 	}
 
 	/// Installs inFunction; the one before it is not copied.
-	void Set(Function inFunction)
-	{
-		const Pointer next = MakePointer(std::move(inFunction));
-		while (!ReplaceIfStill(Get(), next))
-			continue;
-	}
+	void Set(Function inFunction) { mFunction.Set(MakePointer(std::move(inFunction))); }
 
 private:
 	static Pointer MakePointer(Function inFunction)
@@ -60,27 +97,7 @@ private:
 		return inFunction ? std::make_shared<const Function>(std::move(inFunction)) : nullptr;
 	}
 
-	// The host's functions are copied and destroyed without the lock: the caller holds inPrevious.
-	bool ReplaceIfStill(const Pointer& inPrevious, const Pointer& inNext)
-	{
-		const std::lock_guard lock(mState.mMutex);
-		if (mState.mFunction != inPrevious)
-			return false;
-		mState.mFunction = inNext;
-		mState.mIsInstalled.store(inNext != nullptr, std::memory_order_release);
-		return true;
-	}
-
-	struct State
-	{
-		std::atomic<bool> mIsInstalled = false;
-		mutable std::mutex mMutex;
-		Pointer mFunction;
-	};
-	union
-	{
-		State mState;
-	};
+	Replaceable<Function> mFunction;
 };
 
 }   // namespace zoncore

@@ -1,5 +1,6 @@
 #include "zoncore/Localizer.h"
 
+#include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/src/Hook.h"
 #include "zoncore/src/TextKey.h"
@@ -14,6 +15,7 @@ namespace
 {
 
 constinit Hook<bool(std::string_view, UTF16String&)> sTranslator;
+constinit Replaceable<config::MessageCatalogue> sCatalogue;
 
 // Whether the host's translator gave a text for inKey.
 bool Translate(std::string_view inKey, UTF16String& outText)
@@ -53,12 +55,19 @@ UTF16String config::Localizer::Lookup(std::string_view inKey) const
 	UTF16String text;
 	if (Translate(inKey, text))
 		return text;
-	return utility::UTF8to16(EnglishText(inKey));
+	const auto catalogue = sCatalogue.Get();
+	const std::string_view translation = catalogue ? catalogue->Find(inKey) : std::string_view();
+	return utility::UTF8to16(translation.empty() ? EnglishText(inKey) : translation);
 }
 
 void config::Localizer::SetTranslator(Translator inTranslator)
 {
 	sTranslator.Set(std::move(inTranslator));
+}
+
+void config::Localizer::SetCatalogue(const std::shared_ptr<const MessageCatalogue>& inCatalogue)
+{
+	sCatalogue.Set(inCatalogue);
 }
 
 UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements)
