@@ -4,7 +4,6 @@
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16String.h"
-#include "zoncore/WrappingArithmetic.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -201,6 +200,7 @@ TEST_F(ZeroDivisor, OfAnIntegerIsADivideFaultAfterItsReports)
 {
 	const auto divide = [this](auto inDivisor)
 	{
+		std::signal(SIGFPE, SIG_DFL);   // sanitizers have a handler of their own
 		mReports.clear();
 		static_cast<void>(TickTime(1) / inDivisor);
 	};
@@ -218,7 +218,6 @@ TEST_F(ZeroDivisor, OfAnIntegerIsADivideFaultAfterItsReports)
 	};
 	EXPECT_EXIT(divide(0), testing::KilledBySignal(SIGFPE), reports("std::int32_t"));
 	EXPECT_EXIT(divide(0u), testing::KilledBySignal(SIGFPE), reports("std::uint32_t"));
-	EXPECT_EXIT(zoncore::utility::WrappingRemainder(1, 0), testing::KilledBySignal(SIGFPE), "");
 }
 
 TEST_F(ZeroDivisor, ReachesTheCallerAsTheReporterRaisesIt)
