@@ -17,16 +17,25 @@ adopt()
 	"$folder/adopter"
 }
 
-# adopt_by_pkg_config KIND PKG-CONFIG-OPTION...
-adopt_by_pkg_config()
+# compile_by_pkg_config KIND PROGRAM SOURCE-FILE PKG-CONFIG-OPTION...
+compile_by_pkg_config()
 {
-	local prefix=$scratch/installed-$1 kind=$1
-	shift
-	export PKG_CONFIG_PATH=$prefix/lib/pkgconfig
+	local prefix=$scratch/installed-$1 program=$scratch/$2 file=$3
+	shift 3
 	local flags
-	read -ra flags <<<"$(pkg-config "$@" --cflags --libs 'zonmediatypes >= 1')"
-	"${CXX:-c++}" -std=c++20 "$here/Adopter.cpp" -o "$scratch/pkg-config-$kind" "${flags[@]}"
-	LD_LIBRARY_PATH=$prefix/lib "$scratch/pkg-config-$kind"
+	read -ra flags <<<"$(PKG_CONFIG_PATH=$prefix/lib/pkgconfig pkg-config "$@" --cflags --libs 'zonmediatypes >= 1')"
+	"${CXX:-c++}" -std=c++20 "$file" -o "$program" "${flags[@]}"
+	LD_LIBRARY_PATH=$prefix/lib "$program"
+}
+
+# The program of the README, which states its own output in its last comment.
+run_readme_program()
+{
+	sed -n '/^```cpp$/,/^```$/{/^```/!p}' "$source/README.md" >"$scratch/readme.cpp"
+	local said stated
+	said=$(compile_by_pkg_config shared readme "$scratch/readme.cpp")
+	stated=$(sed -n 's|.*// *||p' "$scratch/readme.cpp" | tail -n 1)
+	[ "$said" = "$stated" ] || { echo "the README's program says '$said', and the README '$stated'" >&2; exit 1; }
 }
 
 # none WHAT COMMAND... fails when the command, run in the installation, prints anything.
@@ -63,7 +72,8 @@ case $way in
 		adopt find_package-static -DADOPT_BY=find_package -DADOPT_COMPONENTS=static \
 			-DCMAKE_PREFIX_PATH="$scratch/installed-static"
 		;;
-	pkg-config-shared) adopt_by_pkg_config shared ;;
-	pkg-config-static) adopt_by_pkg_config static --static ;;
+	pkg-config-shared) compile_by_pkg_config shared pkg-config-shared "$here/Adopter.cpp" ;;
+	pkg-config-static) compile_by_pkg_config static pkg-config-static "$here/Adopter.cpp" --static ;;
+	readme) run_readme_program ;;
 	*) echo "adopt.sh: no way is called '$way'" >&2; exit 2 ;;
 esac
