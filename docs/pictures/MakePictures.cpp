@@ -20,6 +20,7 @@ struct NamedPicture
 constexpr auto sPictures = std::to_array<NamedPicture>({
 	{"cadences", pictures::DrawCadences},
 	{"channel-grid", pictures::DrawChannelGrid},
+	{"conversion-costs", pictures::DrawConversionCosts},
 	{"drop-frame", pictures::DrawDropFrame},
 });
 

@@ -4,8 +4,9 @@ namespace pictures
 {
 
 /// Each writes one picture to standard output.
-void DrawChannelGrid();
-void DrawDropFrame();
 void DrawCadences();
+void DrawChannelGrid();
+void DrawConversionCosts();
+void DrawDropFrame();
 
 }   // namespace pictures

@@ -27,7 +27,7 @@ text { font-family: "DejaVu Sans", Verdana, sans-serif; font-size: 13px; fill: #
 .kept { fill: #e3f4e6; stroke: #2f8546; stroke-width: 1.2 }
 .ghost { fill: #fdf1ef; stroke: #b3382c; stroke-width: 1.2; stroke-dasharray: 4 3 }
 .marked { fill: #fff1cc; stroke: #a8720a; stroke-width: 1.8 }
-.listener { fill: #f0f3f6; stroke: #cbd2d9; stroke-width: 1.2 }
+.listener, .none { fill: #f0f3f6; stroke: #cbd2d9; stroke-width: 1.2 }
 </style>
 )";
 
