@@ -13,6 +13,7 @@
 #include <cstdint>
 #include <cstdio>
 #include <limits>
+#include <locale.h>
 #include <random>
 #include <string>
 
@@ -50,9 +51,28 @@ private:
 	std::mt19937_64 mBits{20'260'101};
 };
 
+// The C library's own conversions, which serve as judges, follow the process's locale; not while one of these lives.
+class ClassicCLocale
+{
+public:
+	ClassicCLocale() : mClassic(::newlocale(LC_ALL_MASK, "C", nullptr)), mBefore(::uselocale(mClassic)) {}
+	ClassicCLocale(const ClassicCLocale&) = delete;
+	ClassicCLocale& operator=(const ClassicCLocale&) = delete;
+	~ClassicCLocale()
+	{
+		::uselocale(mBefore);
+		::freelocale(mClassic);
+	}
+
+private:
+	::locale_t mClassic;
+	::locale_t mBefore;
+};
+
 template <class... Arguments>
 std::string Print(const char* inFormat, Arguments... inArguments)
 {
+	const ClassicCLocale locale;
 	std::string text(2'500, '\0');
 	text.resize(static_cast<std::size_t>(std::snprintf(text.data(), text.size(), inFormat, inArguments...)));
 	return text;
@@ -172,6 +192,7 @@ TEST(StringToNumber, ReadsIntegers)
 // What the C library reads from the first inLength characters must be what is read from the whole text.
 void ExpectDouble(const std::string& inText, std::size_t inLength = std::string::npos)
 {
+	const ClassicCLocale locale;
 	double value = 99;
 	ASSERT_TRUE(StringToNumber(AsciiToUTF16(inText), value, 0)) << inText;
 	ASSERT_EQ(std::bit_cast<std::uint64_t>(value),
