@@ -8,22 +8,34 @@
 ///     AVChannelLayout wanted = ToAVChannelLayout(CreateLegacy51ChannelLayout());
 ///     av_channel_layout_copy(&codec->ch_layout, &wanted);
 ///     av_channel_layout_uninit(&wanted);
+///
+///     PixelFormat format = ToPixelFormat(*stream->codecpar, stream->avg_frame_rate);   // or kPixelFormat_Invalid
+///     PixelAspectRatio ratio = ToPixelAspectRatio(av_guess_sample_aspect_ratio(file, stream, nullptr));
 
 #include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PixelAspectRatio.h"
+#include "zonmediatypes/PixelFormatSize.h"
+#include "zonmediatypes/PixelFormatUtils.h"
 
 #include <algorithm>
 #include <array>
 #include <cstddef>
 #include <cstdint>
 #include <functional>
+#include <iterator>
 #include <limits>
 #include <new>
 #include <vector>
 
 extern "C"
 {
+#include <libavcodec/codec_id.h>
+#include <libavcodec/codec_par.h>
 #include <libavutil/channel_layout.h>
 #include <libavutil/mem.h>
+#include <libavutil/pixfmt.h>
+#include <libavutil/rational.h>
 }
 
 namespace zonmediatypes
@@ -87,6 +99,27 @@ AudioChannelLayout ToAudioChannelLayout(const AVChannelLayout& inLayout);
 /// A layout without channels is the result when there is nothing to convert, and when a label has no counterpart (the
 /// Ambisonics components, Pl, Pr and numbers that name no label). Throws std::bad_alloc when memory runs out.
 AVChannelLayout ToAVChannelLayout(const AudioChannelLayout& inLayout);
+
+// ---- Video -----------------------------------------------------------------------------------------------------------
+
+/// The format of the frames of a video stream; kPixelFormat_Invalid where ours has no counterpart. Those that have one:
+/// - uyvy422 and yuyv422, and v210, by their matrix; bgra, argb, bgr0, 0rgb and r210;
+/// - DV by its frame size, its chroma and, where NTSC and PAL are of one size (960x720), by inFrameRate;
+/// - yuv420p of MPEG-2 and of MPEG-4 part 2 by field order, matrix and range. Streams in fields are field pictures; those
+///   that do not say are frame pictures.
+///
+/// A matrix that is not stated is Rec. 709 for frames of more than 576 lines and else Rec. 601, a range that is not stated
+/// is video range for YUV and full range for RGB. Other matrices have no counterpart.
+PixelFormat ToPixelFormat(const AVCodecParameters& inParameters, AVRational inFrameRate);
+
+/// The field that is shown first; kFieldType_Invalid when that is not known.
+FieldType ToFieldType(AVFieldOrder inOrder);
+
+/// A stream's sample aspect ratio as it is; kPixelAspectRatio_Unknown when it is not known, or not positive.
+PixelAspectRatio ToPixelAspectRatio(AVRational inRatio);
+
+/// The ratio for a stream, or the closest one whose terms fit; 0/1, FFmpeg's "unknown", where a term is 0.
+AVRational ToSampleAspectRatio(PixelAspectRatio inRatio);
 
 // ======================================================================================================================
 // Inline implementation
@@ -218,6 +251,169 @@ inline AVChannelLayout ToAVChannelLayout(const AudioChannelLayout& inLayout)
 	if (std::ranges::find(speakers, AV_CHAN_NONE) != speakers.end())
 		return {};
 	return detail::IsNativeOrder(speakers) ? detail::NativeLayout(speakers) : detail::MappedLayout(speakers);
+}
+
+namespace detail
+{
+
+// The built-in format with these properties; kPixelFormat_Invalid when there is none.
+inline PixelFormat FormatWith(PixelFormatProperties inProperties)
+{
+	const PixelFormatName name = GuessNameForProperties(inProperties);
+	return name != kPixelFormatFourCC_Invalid ? PixelFormat{name, inProperties} : kPixelFormat_Invalid;
+}
+
+// The sibling of a YUV format that has the stream's matrix and range.
+inline PixelFormat WithColour(PixelFormatProperties inProperties, const AVCodecParameters& inParameters)
+{
+	constexpr int kMostLinesOfSD = 576;
+	inProperties.SetIsVideoRange(inParameters.color_range != AVCOL_RANGE_JPEG);
+	switch (inParameters.color_space)
+	{
+	case AVCOL_SPC_BT709:
+		inProperties.SetIs709(true);
+		break;
+	case AVCOL_SPC_BT470BG:
+	case AVCOL_SPC_SMPTE170M:
+		inProperties.SetIs709(false);
+		break;
+	case AVCOL_SPC_UNSPECIFIED:
+		inProperties.SetIs709(inParameters.height > kMostLinesOfSD);
+		break;
+	default:   // there are more in every version of FFmpeg
+		return kPixelFormat_Invalid;
+	}
+	return FormatWith(inProperties);
+}
+
+inline PixelFormat InFullRange(PixelFormat inFormat, const AVCodecParameters& inParameters)
+{
+	return inParameters.color_range != AVCOL_RANGE_MPEG ? inFormat : kPixelFormat_Invalid;
+}
+
+// In fields, when it says so.
+inline PixelFormat MPEGFormat(const AVCodecParameters& inParameters, unsigned inFrameCode, unsigned inFieldCode)
+{
+	if (inParameters.format != AV_PIX_FMT_YUV420P)
+		return kPixelFormat_Invalid;
+	const bool isFrame
+		= inParameters.field_order == AV_FIELD_PROGRESSIVE || inParameters.field_order == AV_FIELD_UNKNOWN;
+	PixelFormatProperties properties = kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601.mProperties;
+	properties.SetCompression(isFrame ? inFrameCode : inFieldCode);
+	return WithColour(properties, inParameters);
+}
+
+inline bool IsPALRate(AVRational inFrameRate)
+{
+	return av_cmp_q(inFrameRate, {25, 1}) == 0 || av_cmp_q(inFrameRate, {50, 1}) == 0;
+}
+
+inline bool HasSizeOf(PixelFormat inFormat, const AVCodecParameters& inParameters)
+{
+	int width = 0;
+	int height = 0;
+	FixedSizedFormatDimensions(inFormat, width, height);
+	return inParameters.width == width && inParameters.height == height;
+}
+
+inline PixelFormat DVFormat(const AVCodecParameters& inParameters, AVRational inFrameRate)
+{
+	struct Variant
+	{
+		AVPixelFormat mChroma;
+		PixelFormat mFormat;
+	};
+	const Variant variants[] = {
+		{AV_PIX_FMT_YUV411P, kPixelFormat_NTSCDV25},
+		{AV_PIX_FMT_YUV420P, kPixelFormat_PALDV25},
+		{AV_PIX_FMT_YUV411P, kPixelFormat_PALDV25},   // as DVCPRO has it
+		{AV_PIX_FMT_YUV422P, kPixelFormat_NTSCDV50},
+		{AV_PIX_FMT_YUV422P, kPixelFormat_PALDV50},
+		{AV_PIX_FMT_YUV422P, kPixelFormat_NTSC_DV100_1080i},
+		{AV_PIX_FMT_YUV422P, kPixelFormat_PAL_DV100_1080i},
+		{AV_PIX_FMT_YUV422P, IsPALRate(inFrameRate) ? kPixelFormat_PAL_DV100_720p : kPixelFormat_NTSC_DV100_720p},
+	};
+	const auto variant = std::ranges::find_if(variants,
+		[&](const Variant& inVariant)
+		{ return inParameters.format == inVariant.mChroma && HasSizeOf(inVariant.mFormat, inParameters); });
+	return variant != std::end(variants) ? variant->mFormat : kPixelFormat_Invalid;
+}
+
+// Of codecs that deliver the packed formats as they are.
+inline PixelFormat PackedFormat(const AVCodecParameters& inParameters)
+{
+	switch (inParameters.format)
+	{
+	case AV_PIX_FMT_UYVY422:
+		return WithColour(kPixelFormat_UYVY_422_8u.mProperties, inParameters);
+	case AV_PIX_FMT_YUYV422:
+		return WithColour(kPixelFormat_YUYV_422_8u.mProperties, inParameters);
+	case AV_PIX_FMT_BGRA:
+		return InFullRange(kPixelFormat_BGRA_4444_8u, inParameters);
+	case AV_PIX_FMT_ARGB:
+		return InFullRange(kPixelFormat_ARGB_4444_8u, inParameters);
+	case AV_PIX_FMT_BGR0:
+		return InFullRange(kPixelFormat_BGRX_4444_8u, inParameters);
+	case AV_PIX_FMT_0RGB:
+		return InFullRange(kPixelFormat_XRGB_4444_8u, inParameters);
+	}
+	return kPixelFormat_Invalid;
+}
+
+}   // namespace detail
+
+inline PixelFormat ToPixelFormat(const AVCodecParameters& inParameters, AVRational inFrameRate)
+{
+	switch (inParameters.codec_id)
+	{
+	case AV_CODEC_ID_DVVIDEO:
+		return detail::DVFormat(inParameters, inFrameRate);
+	case AV_CODEC_ID_MPEG2VIDEO:
+		return detail::MPEGFormat(inParameters, kPixelFormatCompression_MPEG2Frame, kPixelFormatCompression_MPEG2Field);
+	case AV_CODEC_ID_MPEG4:
+		return detail::MPEGFormat(inParameters, kPixelFormatCompression_MPEG4Frame, kPixelFormatCompression_MPEG4Field);
+	case AV_CODEC_ID_V210:
+		return detail::WithColour(kPixelFormat_V210_422_10u.mProperties, inParameters);
+	case AV_CODEC_ID_R210:
+		return detail::InFullRange(kPixelFormat_RGB_444_10u, inParameters);
+	default:   // hundreds
+		return detail::PackedFormat(inParameters);
+	}
+}
+
+inline FieldType ToFieldType(AVFieldOrder inOrder)
+{
+	switch (inOrder)
+	{
+	case AV_FIELD_UNKNOWN:
+		return kFieldType_Invalid;
+	case AV_FIELD_PROGRESSIVE:
+		return kFieldType_NoFields;
+	case AV_FIELD_TT:
+	case AV_FIELD_BT:   // stored bottom first, shown top first
+		return kFieldType_UpperFirst;
+	case AV_FIELD_BB:
+	case AV_FIELD_TB:
+		return kFieldType_LowerFirst;
+	}
+	return kFieldType_Invalid;
+}
+
+inline PixelAspectRatio ToPixelAspectRatio(AVRational inRatio)
+{
+	if (inRatio.num <= 0 || inRatio.den <= 0)
+		return kPixelAspectRatio_Unknown;
+	return {static_cast<unsigned>(inRatio.num), static_cast<unsigned>(inRatio.den)};
+}
+
+inline AVRational ToSampleAspectRatio(PixelAspectRatio inRatio)
+{
+	if (inRatio.GetNumerator() == 0 || inRatio.GetDenominator() == 0)
+		return {0, 1};
+	AVRational ratio;
+	av_reduce(
+		&ratio.num, &ratio.den, inRatio.GetNumerator(), inRatio.GetDenominator(), std::numeric_limits<int>::max());
+	return ratio;
 }
 
 }   // namespace zonmediatypes
