@@ -36,10 +36,10 @@ constexpr bool HasSpeaker(AudioChannelLabel inLabel)
 		&& inLabel != kAudioChannelLabel_LFE2;
 }
 
+// The origin for a number that names no label. No pointer to a row: g++ with sanitizers does not compare one in a constant.
 constexpr SpeakerPosition PositionOf(AudioChannelLabel inLabel)
 {
-	const AudioChannelLabelRow* const row = FindLabelRow(inLabel);
-	return row != nullptr ? row->mPosition : SpeakerPosition{0, 0, 0};
+	return kAudioChannelLabels[FindLabelIndex(inLabel)].mPosition;
 }
 
 constexpr std::uint8_t SquaredDistance(AudioChannelLabel inFirst, AudioChannelLabel inSecond)

@@ -97,14 +97,18 @@ inline constexpr auto kLabelRows = []
 	return rows;
 }();
 
+/// The index of a label's row; 0, the row of Discrete, for a number that names none.
+constexpr std::size_t FindLabelIndex(AudioChannelLabel inLabel) noexcept
+{
+	const std::size_t index = LabelIndex(inLabel);
+	return index < kLabelRows.size() ? kLabelRows[index] : 0;
+}
+
 /// The row of a label; null for a number that names none.
 constexpr const AudioChannelLabelRow* FindLabelRow(AudioChannelLabel inLabel) noexcept
 {
-	if (inLabel == kAudioChannelLabel_Discrete)
-		return &kAudioChannelLabels.front();
-	const std::size_t index = LabelIndex(inLabel);
-	const std::size_t row = index < kLabelRows.size() ? kLabelRows[index] : 0;
-	return row != 0 ? &kAudioChannelLabels[row] : nullptr;
+	const std::size_t row = FindLabelIndex(inLabel);
+	return row != 0 || inLabel == kAudioChannelLabel_Discrete ? &kAudioChannelLabels[row] : nullptr;
 }
 
 /// The index of a row of the table.

@@ -18,10 +18,8 @@ struct DropFrameCount
 	constexpr std::uint64_t PerHour() const noexcept { return 6 * PerTenMinutes(); }
 };
 
-inline constexpr DropFrameCount kDropFrame_2997{30, 2};
-inline constexpr DropFrameCount kDropFrame_5994{60, 4};
-static_assert(kDropFrame_2997.PerTenMinutes() == 17'982 && kDropFrame_2997.PerHour() == 107'892);
-static_assert(kDropFrame_5994.PerTenMinutes() == 35'964 && kDropFrame_5994.PerHour() == 215'784);
+static_assert(DropFrameCount{30, 2}.PerTenMinutes() == 17'982 && DropFrameCount{30, 2}.PerHour() == 107'892);
+static_assert(DropFrameCount{60, 4}.PerTenMinutes() == 35'964 && DropFrameCount{60, 4}.PerHour() == 215'784);
 
 /// Hours, minutes, seconds and frames.
 struct HMSF
@@ -55,7 +53,7 @@ constexpr HMSF SplitDropFrames(std::uint64_t inFrames, DropFrameCount inCount) n
 		= (std::max(rest, inCount.mDropped) - inCount.mDropped) / inCount.PerShortMinute();
 	return SplitFrames(inFrames + inCount.mDropped * (9 * tens + shortMinutes), inCount.mNominal);
 }
-static_assert(SplitDropFrames(1'800, kDropFrame_2997) == HMSF{0, 1, 0, 2});
-static_assert(SplitDropFrames(17'982, kDropFrame_2997) == HMSF{0, 10, 0, 0});
+static_assert(SplitDropFrames(1'800, {30, 2}) == HMSF{0, 1, 0, 2});
+static_assert(SplitDropFrames(17'982, {30, 2}) == HMSF{0, 10, 0, 0});
 
 }   // namespace zonmediatypes
