@@ -1,0 +1,238 @@
+// The companion, run as its users run it: what it prints, what it complains about and how it ends.
+
+#include "tests/ProgramRunner.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
+#include <utility>
+
+namespace
+{
+
+using nlohmann::json;
+using testing::HasSubstr;
+
+const std::string kClip = ZON_CLIP;
+
+Outcome Zonmedia(const std::vector<std::string>& inArguments, const std::string& inInput = "")
+{
+	return RunProgram(ZON_PROGRAM, inArguments, inInput);
+}
+
+// The document that a command prints; a test that expects one fails without.
+json Document(std::vector<std::string> inArguments, const std::string& inInput = "", int inStatus = 0)
+{
+	inArguments.emplace_back("--json");
+	const Outcome outcome = Zonmedia(inArguments, inInput);
+	EXPECT_EQ(outcome.mStatus, inStatus) << outcome.mErrors;
+	json document = json::parse(outcome.mOutput, nullptr, false);
+	EXPECT_FALSE(document.is_discarded()) << outcome.mOutput;
+	return document;
+}
+
+// What a document is expected to say, by place.
+using Facts = std::vector<std::pair<const char*, json>>;
+
+void ExpectFacts(const json& inDocument, const Facts& inFacts)
+{
+	for (const auto& [place, value] : inFacts)
+	{
+		const json::json_pointer pointer(place);
+		ASSERT_TRUE(inDocument.contains(pointer)) << place << " in " << inDocument.dump(2);
+		EXPECT_EQ(inDocument.at(pointer), value) << place;
+	}
+}
+
+// ---- Results of commands ---------------------------------------------------------------------------------------------
+
+struct LineCase
+{
+	std::vector<std::string> mArguments;
+	std::string mLine;
+	std::string mInput = "";
+};
+
+TEST(Zonmedia, PrintsTheResultAlone)
+{
+	const std::vector<LineCase> cases = {
+		{{"time", "01:00:00;00", "--rate", "29.97", "--to", "frames"}, "107892\n"},
+		{{"time", "107892", "--rate", "30000/1001", "--display", "frames", "--to", "29.97df"}, "01:00:00;00\n"},
+		{{"time", "01:00:00:00", "--display", "25", "--to", "ticks"}, "914457600000000\n"},
+		{{"time", "62+08", "--rate", "24", "--display", "35mm", "--to", "24"}, "00:00:41:16\n"},
+		{{"time", "00:00:01:00", "--display", "25", "--to", "samples", "--to-rate", "48000Hz"}, "00:00:01:00000\n"},
+		// Values that begin as options do
+		{{"time", "-00:00:01:00", "--rate", "25", "--to", "ticks"}, "-254016000000\n"},
+		{{"time", "-:30", "--rate", "25", "--to", "ms"}, "-00:00:01.200\n"},
+		{{"time", "--to", "frames", "-1001001", "--rate", "48000Hz", "--display", "frames"}, "-1001001\n"},
+		{{"time", "-", "--rate", "29.97", "--display", "frames", "--to", "29.97df"},
+			"00:00:59;29\n00:01:00;02\n00:10:00;00\n", "1799\n\n 1800 \r\n17982"},
+		{{"samples", "2882880", "--rate", "48000", "--format", "samples", "--to", "dropframe"}, "00;01;00;02\n"},
+		{{"samples", "00;01;00;02", "--rate", "48000Hz", "--format", "dropframe", "--to", "samples"}, "2882880\n"},
+		{{"samples", "132000", "--rate", "48000", "--format", "samples", "--to", "bars"}, "2:2.480\n"},
+		{{"samples", "132000", "--rate", "48000", "--format", "samples", "--to", "bars", "--meter", "3/4", "--tempo",
+			 "60"},
+			"1:3.720\n"},
+		{{"samples", "-2928000", "--rate", "48000", "--format", "samples", "--to", "timecode"}, "-00:01:01:00\n"},
+	};
+	for (const LineCase& testCase : cases)
+	{
+		const Outcome outcome = Zonmedia(testCase.mArguments, testCase.mInput);
+		EXPECT_EQ(outcome.mOutput, testCase.mLine) << testing::PrintToString(testCase.mArguments);
+		EXPECT_EQ(outcome.mStatus, 0) << outcome.mErrors;
+		EXPECT_EQ(outcome.mErrors, "");
+	}
+}
+
+TEST(Zonmedia, PrintsOneDocument)
+{
+	ExpectFacts(Document({"time", "01:00:00;00", "--rate", "29.97"}),
+		{{"/times/0/value", "01:00:00;00"}, {"/times/0/rate", "30000/1001"}, {"/times/0/rateIsRounded", false},
+			{"/times/0/ticks", 914'456'685'542'400}, {"/problems", json::array()}});
+	ExpectFacts(Document({"time", "-", "--rate", "2997/100", "--display", "frames", "--to", "ms"}, "1\nx\n2\n", 1),
+		{{"/times/1/result", "00:00:00.066"}, {"/times/0/rateIsRounded", true},
+			{"/problems/0/input", "line 2: \"x\""}});
+	ExpectFacts(Document({"samples", "48000", "--rate", "48000", "--format", "samples", "--fps", "25"}),
+		{{"/positions/0/sampleRate", 48'000}, {"/positions/0/formats/2/format", "timecode"},
+			{"/positions/0/formats/2/text", "00:00:01:00"}});
+}
+
+// ---- Complaints ------------------------------------------------------------------------------------------------------
+
+struct ProblemCase
+{
+	std::vector<std::string> mArguments;
+	int mStatus;
+	std::string mLine;   // a part of the one line on standard error
+};
+
+TEST(Zonmedia, ComplainsInOneLine)
+{
+	const std::vector<ProblemCase> cases = {
+		{{}, 2, "subcommand is required"},
+		{{"tiem"}, 2, "no command is named \"tiem\"; the closest are time"},
+		{{"time"}, 2, "VALUE is required"},
+		{{"time", "1", "--rate", "25", "--frames"}, 2, "--frames"},
+		{{"time", "1", "--display", "frames"}, 2, "--rate is required"},
+		{{"time", "1", "--rate", "23.98"}, 2, "\"23.98\"; the closest are 23.976"},
+		{{"time", "1", "--rate", "0/1"}, 2, "\"0/1\" cannot be used"},
+		{{"time", "1", "--rate", "9223372036854775807/1"}, 2, "cannot be used"},
+		{{"time", "1", "--rate", "1/9223372036854775807"}, 2, "cannot be used"},
+		{{"time", "1", "--rate", "25", "--display", "29.97fd"}, 2,
+			"no display is named \"29.97fd\"; the closest are 29.97df"},
+		{{"time", "1::2", "--display", "29.97df"}, 1, "such as 01:02:03;04"},
+		{{"time", "1::2", "--display", "ms"}, 1, "such as 01:02:03.004"},
+		{{"time", "1.5", "--rate", "25", "--display", "frames"}, 1, "such as 93079"},
+		{{"time", "1.5", "--rate", "25", "--display", "ticks"}, 1, "whole number of ticks"},
+		{{"samples", "none", "--rate", "48000", "--format", "bars"}, 1, "\"none\": no digits"},
+		{{"samples", "1", "--rate", "48000", "--format", "dropframe", "--fps", "25"}, 2, "--fps 25"},
+		{{"samples", "1", "--rate", "48000", "--format", "bars", "--meter", "0/4"}, 2, "\"0/4\""},
+		{{"sheet", "missing.mov"}, 1, "missing.mov: No such file"},
+		{{"sheet", "/"}, 1, "/: Is a directory"},
+		{{"sheet", ZON_PROGRAM}, 1, "not a media file"},
+		{{"sheet", "http://127.0.0.1/clip.mov"}, 1, "No such file"},   // names are files, never addresses
+		{{"sheet", "line\nbreak"}, 1, "line?break"},
+	};
+	for (const ProblemCase& testCase : cases)
+	{
+		const Outcome outcome = Zonmedia(testCase.mArguments);
+		EXPECT_EQ(outcome.mStatus, testCase.mStatus) << testing::PrintToString(testCase.mArguments);
+		EXPECT_EQ(outcome.mOutput, "");
+		EXPECT_THAT(outcome.mErrors, HasSubstr(testCase.mLine));
+		EXPECT_THAT(outcome.mErrors, testing::StartsWith("zonmedia: "));
+		EXPECT_EQ(std::ranges::count(outcome.mErrors, '\n'), 1) << outcome.mErrors;
+	}
+}
+
+TEST(Zonmedia, ShowsTheOtherFilesWhenOneIsBad)
+{
+	const Outcome text = Zonmedia({"sheet", "missing.mov", kClip});
+	EXPECT_EQ(text.mStatus, 1);
+	EXPECT_THAT(text.mErrors, HasSubstr("missing.mov"));
+	EXPECT_THAT(text.mOutput, HasSubstr("00:59:58;00"));
+	ExpectFacts(Document({"sheet", "missing.mov", kClip, "\xFF.mov"}, "", 1),
+		{{"/files/0/file", kClip}, {"/problems/0/input", "missing.mov"}, {"/problems/1/input", "\uFFFD.mov"}});
+}
+
+TEST(Zonmedia, ComplainsWhenNothingCanBeWritten)
+{
+	EXPECT_EQ(
+		std::system((ShellQuoted(ZON_PROGRAM) + " sheet " + ShellQuoted(kClip) + " >/dev/full 2>/dev/null").c_str())
+			>> 8,
+		1);
+}
+
+TEST(Zonmedia, HelpsWithExamples)
+{
+	for (const char* const command : {"sheet", "time", "samples", "check", "keys"})
+	{
+		const Outcome outcome = Zonmedia({command, "--help"});
+		EXPECT_EQ(outcome.mStatus, 0);
+		EXPECT_THAT(outcome.mOutput, HasSubstr("Examples:\n  zonmedia " + std::string(command)));
+	}
+	EXPECT_THAT(Zonmedia({"--help"}).mOutput, HasSubstr("Exit status"));
+}
+
+// ---- Sheets ----------------------------------------------------------------------------------------------------------
+
+TEST(Zonmedia, ShowsTheClip)
+{
+	const json document = Document({"sheet", kClip});
+	ExpectFacts(document.at("files").at(0),
+		{{"/rate", "30000/1001"}, {"/frameDuration", 8'475'667'200}, {"/display", "29.97df"},
+			{"/start", {{"text", "00:59:58;00"}, {"ticks", 107'832 * 8'475'667'200}}},
+			{"/end", {{"text", "01:00:03;00"}, {"ticks", 107'982 * 8'475'667'200}}},
+			{"/lastFrame", {{"text", "01:00:02;29"}, {"ticks", 107'981 * 8'475'667'200}}},
+			{"/duration", {{"text", "00:00:05;00"}, {"ticks", 150 * 8'475'667'200}}}, {"/frames", 150},
+			{"/audioStreams/0/rate", 48'000}, {"/audioStreams/0/layout", "Stereo"}});
+	const Facts durations = {{"24", "00:00:05:00"}, {"59.94df", "00:00:05;00"}, {"frames", "150"}, {"16mm", "3+30"},
+		{"35mm", "9+06"}, {"samples", "00:00:05:00240"}, {"ms", "00:00:05.005"}, {"ticks", "1271350080000"}};
+	for (const auto& [display, text] : durations)
+	{
+		const json& rows = document.at("/files/0/durationInOtherDisplays"_json_pointer);
+		const auto row
+			= std::ranges::find_if(rows, [name = display](const json& inRow) { return inRow["display"] == name; });
+		ASSERT_NE(row, rows.end()) << display;
+		EXPECT_EQ((*row)["text"], text) << display;
+	}
+}
+
+struct SheetCase
+{
+	const char* mFile;
+	Facts mFacts;
+};
+
+TEST(Zonmedia, ShowsWhatOtherSoftwareWrites)
+{
+	if (std::system("ffmpeg -version >/dev/null 2>&1") != 0)
+		GTEST_SKIP() << "ffmpeg makes the files of this test, and it is not installed";
+	const std::string folder = Scratch() / "media";
+	ASSERT_EQ(
+		std::system(("sh " + ShellQuoted(ZON_TEST_DATA "/make-media.sh") + " " + ShellQuoted(folder)).c_str()), 0);
+	const std::vector<SheetCase> cases = {
+		{"v210-drop.mov", {{"/start/text", "01:00:00;00"}, {"/lastFrame/text", "01:00:00;01"}, {"/frames", 2}}},
+		{"v210-non-drop.mov", {{"/rate", "24000/1001"}, {"/display", "23.976"}, {"/end/text", "01:00:00:02"}}},
+		{"over-midnight.mov", {{"/display", "59.94df"}, {"/start/text", "23:59:59;58"}, {"/end/text", "00:00:00;06"}}},
+		{"inexact.avi",
+			{{"/rate", "2997/100"}, {"/rateIsRounded", true}, {"/frameDuration", 8'475'675'676}, {"/display", "frames"},
+				{"/end/text", "1000"}}},
+		{"fifteen.mp4", {{"/rate", "15"}, {"/display", "frames"}, {"/lastFrame/text", "14"}}},
+		{"mpeg2-pal.m2v", {{"/frames", 3}, {"/end/text", "00:00:00:03"}, {"/timecodeTag", nullptr}}},
+		{"dv25-ntsc.dv", {{"/frames", 1}, {"/frameDuration", 8'475'667'200}}},
+		{"dv100-720p60.mov", {{"/display", "59.94df"}}},
+		{"mono.wav",
+			{{"/rate", "48000"}, {"/display", "samples"}, {"/samples", 480}, {"/milliseconds", "00:00:00.010"}}},
+		{"ten-hours.wav", {{"/start/text", "10:00:00:00000"}, {"/lastSample/text", "10:00:00:00479"}}},
+		{"stereo.aac", {{"/samples", 49'152}}},
+	};
+	for (const SheetCase& testCase : cases)
+	{
+		SCOPED_TRACE(testCase.mFile);
+		ExpectFacts(Document({"sheet", folder + "/" + testCase.mFile}).at("files").at(0), testCase.mFacts);
+	}
+	for (const char* const file : {"notes.txt", "empty.mov", "letters.bin"})
+		EXPECT_THAT(Zonmedia({"sheet", folder + "/" + file}).mErrors, HasSubstr("not a media file")) << file;
+}
+
+}   // namespace

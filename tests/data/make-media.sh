@@ -1,0 +1,62 @@
+#!/bin/sh
+# Makes small media files of many kinds, for tests against what other software writes.
+#   usage: make-media.sh FOLDER      needs Debian's ffmpeg
+set -eu
+folder=${1:?usage: make-media.sh FOLDER}
+mkdir -p "$folder"
+cd "$folder"
+
+make() { ffmpeg -nostdin -hide_banner -loglevel error -y "$@"; }
+picture() { echo "testsrc=size=$1:rate=$2"; }
+plain() { echo "color=c=gray:size=$1:rate=$2"; }
+
+# Tones in so many channels of a layout: channels LAYOUT SECONDS
+tones() {
+	expressions=$(seq 1 "$1" | sed 's/.*/0.2*sin(2*PI*t*&00)/' | paste -sd '|')
+	echo "aevalsrc=exprs=$expressions:s=48000:c=$2:d=$3"
+}
+
+# DV, whose frame size is fixed by its variant
+make -f lavfi -i "$(picture 720x480 30000/1001)" -frames:v 1 -vf setsar=8/9 -pix_fmt yuv411p -c:v dvvideo -f dv dv25-ntsc.dv
+make -f lavfi -i "$(picture 720x576 25)" -frames:v 1 -vf setsar=16/15 -pix_fmt yuv420p -c:v dvvideo -f dv dv25-pal.dv
+make -f lavfi -i "$(picture 720x480 30000/1001)" -frames:v 1 -pix_fmt yuv422p -c:v dvvideo -f dv dv50-ntsc.dv
+make -f lavfi -i "$(picture 720x576 25)" -frames:v 1 -pix_fmt yuv422p -c:v dvvideo -f dv dv50-pal.dv
+make -f lavfi -i "$(picture 960x720 60000/1001)" -frames:v 1 -pix_fmt yuv422p -c:v dvvideo dv100-720p60.mov
+make -f lavfi -i "$(picture 1280x1080 30000/1001)" -frames:v 1 -pix_fmt yuv422p -c:v dvvideo dv100-1080i60.mov
+make -f lavfi -i "$(picture 1440x1080 25)" -frames:v 1 -pix_fmt yuv422p -c:v dvvideo dv100-1080i50.mov
+
+# MPEG, interlaced, as bare streams that state no length
+make -f lavfi -i "$(plain 720x576 25)" -frames:v 3 -vf setsar=16/15 -pix_fmt yuv420p -c:v mpeg2video \
+	-flags +ilme+ildct -top 0 -q:v 31 -f mpeg2video mpeg2-pal.m2v
+make -f lavfi -i "$(plain 1440x1080 25)" -frames:v 2 -vf setsar=4/3 -pix_fmt yuv420p -c:v mpeg2video \
+	-flags +ilme+ildct -top 1 -q:v 31 -colorspace bt709 -color_primaries bt709 -color_trc bt709 -f mpeg2video mpeg2-709.m2v
+
+# Timecode tracks
+make -f lavfi -i "$(picture 48x32 30000/1001)" -frames:v 2 -pix_fmt yuv422p10le -c:v v210 -timecode '01:00:00;00' v210-drop.mov
+make -f lavfi -i "$(picture 50x32 24000/1001)" -frames:v 2 -pix_fmt yuv422p10le -c:v v210 -timecode '01:00:00:00' v210-non-drop.mov
+make -f lavfi -i "$(plain 64x48 60000/1001)" -frames:v 8 -c:v mpeg4 -q:v 31 -timecode '23:59:59;58' over-midnight.mov
+
+# Packed pictures
+make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt uyvy422 -c:v rawvideo uyvy.mov
+make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt yuyv422 -c:v rawvideo yuyv.mov
+make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt bgra -c:v rawvideo bgra.avi
+make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt argb -c:v rawvideo argb.mov
+
+# Rates: one that is written with two decimals, and one without a display of its own
+make -f lavfi -i "$(plain 64x48 2997/100)" -frames:v 1000 -c:v mpeg4 -q:v 31 inexact.avi
+make -f lavfi -i "$(plain 64x48 15)" -frames:v 15 -c:v mpeg4 -q:v 31 fifteen.mp4
+
+# Sound
+make -f lavfi -i "$(tones 1 mono 0.01)" -c:a pcm_s16le mono.wav
+make -f lavfi -i "$(tones 2 stereo 0.01)" -c:a pcm_s16le stereo.wav
+make -f lavfi -i "$(tones 6 5.1 0.01)" -c:a pcm_s16le 5.1-back.wav
+make -f lavfi -i "$(tones 6 '5.1(side)' 0.01)" -c:a pcm_s16le 5.1-side.wav
+make -f lavfi -i "$(tones 8 7.1 0.01)" -c:a pcm_s24le 7.1.wav
+make -f lavfi -i "$(tones 6 5.1 0.05)" -c:a aac -b:a 128k 5.1.m4a
+make -f lavfi -i "$(tones 2 stereo 1)" -c:a aac -b:a 64k -f adts stereo.aac
+make -f lavfi -i "$(tones 1 mono 0.01)" -c:a pcm_s24le -write_bext 1 -metadata time_reference=1728000000 ten-hours.wav
+
+# No media
+printf 'Notes about a film.\n' > notes.txt
+: > empty.mov
+head -c 2000 stereo.aac | tr '\0-\377' 'a-za-za-za-za-za-za-za-z' > letters.bin

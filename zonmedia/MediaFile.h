@@ -1,0 +1,48 @@
+#pragma once
+
+/// \file
+/// What a media file says about itself, as a plain value.
+
+#include "zonmedia/Fraction.h"
+#include "zonmediatypes/AudioChannelLayout.h"
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace zonmedia
+{
+
+struct VideoStream
+{
+	std::string mCodec;
+	std::string mStoredFormat;   ///< the pixel format by the name that the reading library has for it
+	Fraction mRate;              ///< frames a second; 0 when the file does not say
+	std::optional<std::int64_t> mFrameCount;
+	int mWidth = 0;
+	int mHeight = 0;
+};
+
+struct AudioStream
+{
+	std::string mCodec;
+	std::int64_t mSampleRate = 0;
+	zonmediatypes::AudioChannelLayout mLayout;   ///< each channel by its role in the file
+	std::optional<std::int64_t> mSampleCount;
+};
+
+struct MediaFile
+{
+	std::string mFormat;
+	std::optional<VideoStream> mVideo;   ///< the first video stream; a cover picture is none
+	std::vector<AudioStream> mAudio;
+	std::string mStartTimecode;                 ///< the tag's text; empty without a tag
+	std::optional<std::int64_t> mStartSample;   ///< the time reference of a broadcast wave
+};
+
+/// Reads the headers of the file at inPath, and counts its frames where no header tells. Throws InputProblem when the file
+/// is missing, cannot be read, or is no media.
+MediaFile ReadMediaFile(const std::string& inPath);
+
+}   // namespace zonmedia

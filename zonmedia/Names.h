@@ -1,0 +1,60 @@
+#pragma once
+
+/// \file
+/// Names for the values of the library, as they are typed on a command line.
+///
+/// Every list of names is made from the library's own tables. What is found nowhere is refused with the closest names.
+
+#include "zonmedia/Problem.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace zonmedia
+{
+
+template <class T>
+struct Named
+{
+	std::string mName;
+	T mValue;
+};
+
+/// The least number of characters to put in, take out or replace to turn one text into the other. Letters of either case
+/// are the same, as are "_", "-" and blanks.
+std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS);
+
+/// A sentence that refuses inText: what it is no name of, and the closest of inNames.
+std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames);
+
+/// The value that inText names: exactly, or else but for case and "_". Throws UsageProblem with the closest names.
+/// inWhat is what is named: "display".
+template <class T>
+const T& ValueNamed(std::span<const Named<T>> inAll, std::string_view inWhat, std::string_view inText)
+{
+	const auto exact = std::ranges::find(inAll, inText, &Named<T>::mName);
+	if (exact != inAll.end())
+		return exact->mValue;
+	const auto isMeant = [inText](const Named<T>& inNamed) { return EditDistance(inNamed.mName, inText) == 0; };
+	const auto meant = std::ranges::find_if(inAll, isMeant);
+	if (meant != inAll.end())
+		return meant->mValue;
+	std::vector<std::string_view> names;
+	for (const Named<T>& named : inAll)
+		names.emplace_back(named.mName);
+	throw UsageProblem(UnknownName(inWhat, inText, std::move(names)));
+}
+
+/// The name of a value; empty when it has none.
+template <class T>
+std::string NameOf(std::span<const Named<T>> inAll, const T& inValue)
+{
+	const auto named = std::ranges::find(inAll, inValue, &Named<T>::mValue);
+	return named == inAll.end() ? std::string() : named->mName;
+}
+
+}   // namespace zonmedia
