@@ -36,6 +36,10 @@ TEST(Hashes, AreEqualForEqualValuesAndDifferByField)
 	EXPECT_NE(Hash(PointT<int>{1, 2}), Hash(PointT<int>{2, 1}));
 	EXPECT_NE(Hash(AudioChannelLayout()), Hash(CreateMultichannelLayout(1)));
 	EXPECT_NE(Hash(CreateMultichannelLayout(2)), Hash(CreateMultichannelLayout(3)));
+	EXPECT_NE(Hash(kPixelFormat_VUYA_4444_8u),
+		Hash(PixelFormat{kPixelFormatFourCC_Any, kPixelFormat_VUYA_4444_8u.mProperties}));
+	EXPECT_NE(Hash(kPixelFormat_VUYA_4444_8u), Hash(PixelFormat{kPixelFormat_VUYA_4444_8u.mName, {}}));
+	EXPECT_NE(Hash(kPixelFormatProperties_Any), Hash(kPixelFormatProperties_Invalid));
 	EXPECT_NE(Hash(zoncore::Flags<unsigned int>(1)), Hash(zoncore::Flags<unsigned int>(2)));
 }
 
@@ -108,6 +112,13 @@ TEST(Streams, WriteEveryValue)
 	ExpectText(AudioChannelLayout(), "no channels");
 	ExpectText(AudioFormat::CreateDefaultAudioFormat(2, 48'000), "48000 Hz, 32 bits, L R");
 	ExpectText(AudioFormat(), "0 Hz, 0 bits, no channels");
+	ExpectText(MakePixelFormatName('v', '2', '1', '0'), "v210");
+	ExpectText(kPixelFormatFourCC_Any, "any");
+	ExpectText(MakePixelFormatName('a', 'b', 'c', '\0'), "0x636261");
+	ExpectText(MakePixelFormatName('a', '\n', 'c', 'd'), "0x64630a61");
+	ExpectText(kPixelFormat_VUYA_4444_8u.mProperties, "0x400c1");
+	ExpectText(kPixelFormat_VUYA_4444_8u, "VUYA 4444 8u");
+	ExpectText(kPixelAspectRatio_DVNTSC, "0.9091");
 	ExpectText(PointT<int>{1'920, -1}, "(1920, -1)");
 	ExpectText(RectT<int>{0, 1, 1'920, 1'080}, "(0, 1, 1920, 1080)");
 	ExpectText(zoncore::Flags<unsigned char>(0x1B), "0x1b");

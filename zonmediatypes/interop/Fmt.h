@@ -12,6 +12,9 @@
 
 	#include "zonmediatypes/AudioChannelLayout.h"
 	#include "zonmediatypes/FrameRate.h"
+	#include "zonmediatypes/PixelAspectRatio.h"
+	#include "zonmediatypes/PixelFormat.h"
+	#include "zonmediatypes/PixelFormatProperties.h"
 	#include "zonmediatypes/TickTime.h"
 	#include "zonmediatypes/interop/Streams.h"
 
@@ -25,6 +28,10 @@ template <> struct fmt::formatter<zonmediatypes::AudioChannelDescription> : fmt:
 template <> struct fmt::formatter<zonmediatypes::AudioChannelLayout> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::ChannelMap> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::AudioFormat> : fmt::ostream_formatter {};
+template <> struct fmt::formatter<zonmediatypes::PixelFormatName> : fmt::ostream_formatter {};
+template <> struct fmt::formatter<zonmediatypes::PixelFormatProperties> : fmt::ostream_formatter {};
+template <> struct fmt::formatter<zonmediatypes::PixelFormat> : fmt::ostream_formatter {};
+template <> struct fmt::formatter<zonmediatypes::PixelAspectRatio> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::utility::BeatInfo> : fmt::ostream_formatter {};
 template <class T> struct fmt::formatter<zoncore::PointT<T>> : fmt::ostream_formatter {};
 template <class T> struct fmt::formatter<zoncore::RectT<T>> : fmt::ostream_formatter {};

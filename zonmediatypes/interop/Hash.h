@@ -15,6 +15,8 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/PixelFormat.h"
+#include "zonmediatypes/PixelFormatProperties.h"
 #include "zonmediatypes/TickTime.h"
 
 #include <concepts>
@@ -87,6 +89,24 @@ struct std::hash<zonmediatypes::AudioChannelLayout>
 		for (const zonmediatypes::AudioChannelDescription channel : inLayout)
 			sum = zonmediatypes::detail::AddToHash(sum, static_cast<std::uint64_t>(channel.mLabel));
 		return static_cast<std::size_t>(sum);
+	}
+};
+
+template <>
+struct std::hash<zonmediatypes::PixelFormatProperties>
+{
+	std::size_t operator()(zonmediatypes::PixelFormatProperties inProperties) const noexcept
+	{
+		return zonmediatypes::detail::HashOf(inProperties.GetValue());
+	}
+};
+
+template <>
+struct std::hash<zonmediatypes::PixelFormat>
+{
+	std::size_t operator()(zonmediatypes::PixelFormat inFormat) const noexcept
+	{
+		return zonmediatypes::detail::HashOf(inFormat.mName, inFormat.mProperties.GetValue());
 	}
 };
 

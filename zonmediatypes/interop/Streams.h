@@ -19,8 +19,13 @@
 #include "zonmediatypes/AudioChannelMap.h"
 #include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PixelFormat.h"
+#include "zonmediatypes/PixelFormatProperties.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 
+#include <algorithm>
+#include <array>
+#include <charconv>
 #include <concepts>
 #include <cstdint>
 #include <locale>
@@ -41,6 +46,14 @@ inline std::ostream& operator<<(std::ostream& inStream, const UTF16String& inTex
 
 namespace zoncore::detail
 {
+
+/// A number as "0x1b".
+inline std::string HexText(std::uint64_t inNumber)
+{
+	std::array<char, 16> digits{};
+	const auto end = std::to_chars(digits.begin(), digits.end(), inNumber, 16).ptr;
+	return "0x" + std::string(digits.begin(), end);
+}
 
 /// What inWrite writes to a stream with default settings.
 template <class Write>
@@ -117,6 +130,16 @@ inline std::string ChannelMapText(const ChannelMap& inMap)
 	return text.empty() ? "no entries" : text;
 }
 
+inline std::string NameText(PixelFormatName inName)
+{
+	std::string text;
+	for (std::uint32_t rest = inName; rest != 0; rest >>= 8)
+		text += static_cast<char>(rest & 0xFF);
+	const bool isText
+		= text.size() == 4 && std::ranges::all_of(text, [](char inChar) { return inChar >= ' ' && inChar <= '~'; });
+	return isText ? text : inName == kPixelFormatFourCC_Any ? "any" : zoncore::detail::HexText(inName);
+}
+
 }   // namespace detail
 
 /// The abbreviation, as in "Ls"; "label 120" for a number that names none.
@@ -148,6 +171,18 @@ inline std::ostream& operator<<(std::ostream& inStream, const AudioFormat& inFor
 	return inStream << std::to_string(inFormat.GetSampleRate()) + " Hz, "
 		+ std::to_string(std::int64_t{inFormat.GetSampleType()} * 8 / 10) + " bits, "
 		+ detail::LayoutText(inFormat.GetChannelLayout());
+}
+
+/// The four characters: "bgra"; "any" for the wildcard and a number for what is no text: "0x1".
+inline std::ostream& operator<<(std::ostream& inStream, PixelFormatName inName)
+{
+	return inStream << detail::NameText(inName);
+}
+
+/// The value: "0x400c0".
+inline std::ostream& operator<<(std::ostream& inStream, PixelFormatProperties inProperties)
+{
+	return inStream << zoncore::detail::HexText(inProperties.GetValue());
 }
 
 namespace utility
