@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -16,6 +18,71 @@ namespace
 {
 
 #if ZON_HAS_LIBAVUTIL
+
+// ---- Time ------------------------------------------------------------------------------------------------------------
+
+std::optional<FrameRate> RateOf(int inNumerator, int inDenominator)
+{
+	return ToFrameRate({inNumerator, inDenominator});
+}
+
+TEST(FFmpegTime, ConvertsTheNamedRatesBothWays)
+{
+	EXPECT_EQ(RateOf(30'000, 1'001), kFrameRate_VideoNTSC);
+	EXPECT_EQ(RateOf(50, 2), kFrameRate_VideoPAL);
+	EXPECT_EQ(RateOf(0, 1), kFrameRate_Zero);
+	for (const FrameRate rate : AllFrameRates())
+	{
+		const auto ratio = ToAVRational(rate);
+		ASSERT_TRUE(ratio.has_value());
+		EXPECT_EQ(ToFrameRate(*ratio), rate);
+		EXPECT_NEAR(av_q2d(*ratio),
+			rate == kFrameRate_Zero ? 0.0 : 254'016'000'000.0 / static_cast<double>(rate.GetTicksPerFrame()), 1e-6);
+	}
+}
+
+TEST(FFmpegTime, HasNoCounterpartForWhatIsNoRate)
+{
+	EXPECT_EQ(RateOf(-25, 1), std::nullopt);
+	EXPECT_EQ(RateOf(25, -1), std::nullopt);
+	EXPECT_EQ(RateOf(25, 0), std::nullopt);
+	EXPECT_EQ(RateOf(0, 0), std::nullopt);
+	EXPECT_EQ(RateOf(2'997, 100), std::nullopt) << "no whole number of ticks";
+	EXPECT_FALSE(ToAVRational(FrameRate(0)).has_value());
+	EXPECT_FALSE(ToAVRational(FrameRate(-5)).has_value());
+	EXPECT_FALSE(ToAVRational(FrameRate(10'594'583'999)).has_value()) << "a term beyond 32 bits";
+	EXPECT_FALSE(ToTimeBase({1, 0}).has_value());
+	EXPECT_FALSE(ToTimeBase({-1, 25}).has_value());
+}
+
+TEST(FFmpegTime, RescalesTimestampsAsAvRescaleDoes)
+{
+	constexpr AVRational kNanoseconds{1, 1'000'000'000};
+	for (const AVRational base :
+		{AVRational{1, 90'000}, AVRational{1'001, 30'000}, AVRational{2, 44'100}, AVRational{7, 30}, kNanoseconds})
+	{
+		const auto reduced = ToAVRational(ToTimeBase(base).value());
+		ASSERT_TRUE(reduced.has_value());
+		EXPECT_EQ(av_cmp_q(*reduced, base), 0);
+		for (const std::int64_t stamp : {0LL, 1LL, -1LL, 12'345LL, -12'345LL, 123'456'789LL})
+		{
+			const auto time = ToTickTime(stamp, base, Rounding::Nearest);
+			ASSERT_TRUE(time.has_value());
+			EXPECT_EQ(time->GetTicks(), av_rescale_rnd(stamp * base.num, 254'016'000'000, base.den, AV_ROUND_NEAR_INF));
+			EXPECT_EQ(ToTimestamp(*time, base, Rounding::Nearest), stamp);
+		}
+	}
+}
+
+TEST(FFmpegTime, MarksWhatHasNoTimestamp)
+{
+	EXPECT_EQ(ToTickTime(AV_NOPTS_VALUE, {1, 25}, Rounding::Nearest), std::nullopt);
+	EXPECT_EQ(ToTickTime(1, {1, 0}, Rounding::Nearest), std::nullopt);
+	EXPECT_EQ(ToTickTime(std::numeric_limits<std::int64_t>::max(), {1, 25}, Rounding::Nearest), std::nullopt);
+	EXPECT_EQ(ToTimestamp(kTime_Invalid, {1, 25}, Rounding::Nearest), AV_NOPTS_VALUE);
+	EXPECT_EQ(ToTimestamp(kTime_Max, {0, 25}, Rounding::Nearest), AV_NOPTS_VALUE);
+	EXPECT_EQ(ToTimestamp(TickTime(1), {1, 25}, Rounding::Up), 1);
+}
 
 // ---- Audio -----------------------------------------------------------------------------------------------------------
 

@@ -6,6 +6,7 @@
 #include <gmock/gmock.h>
 
 #include <iomanip>
+#include <type_traits>
 #include <unordered_map>
 #include <unordered_set>
 #include <vector>
@@ -22,6 +23,9 @@ std::size_t Hash(const T& inValue)
 {
 	return std::hash<T>()(inValue);
 }
+
+// Tolerant equality has no hash that agrees with it.
+static_assert(!std::is_default_constructible_v<std::hash<PixelAspectRatio>>);
 
 // ---- Hashes ----------------------------------------------------------------------------------------------------------
 

@@ -3,6 +3,9 @@
 /// \file
 /// Values of FFmpeg's libraries and ours. For programs that use FFmpeg: they bring its headers and link libavutil.
 ///
+///     const auto start = ToTickTime(stream->start_time, stream->time_base, Rounding::Nearest);
+///     const auto rate = ToFrameRate(stream->avg_frame_rate);                           // 30000/1001: kFrameRate_VideoNTSC
+///
 ///     AudioChannelLayout layout = ToAudioChannelLayout(stream->codecpar->ch_layout);   // 5.1(side): L R C LFE Ls Rs
 ///
 ///     AVChannelLayout wanted = ToAVChannelLayout(CreateLegacy51ChannelLayout());
@@ -14,9 +17,12 @@
 
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/PixelAspectRatio.h"
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
+#include "zonmediatypes/TickTime.h"
+#include "zonmediatypes/interop/TimeBase.h"
 
 #include <algorithm>
 #include <array>
@@ -26,12 +32,15 @@
 #include <iterator>
 #include <limits>
 #include <new>
+#include <optional>
+#include <utility>
 #include <vector>
 
 extern "C"
 {
 #include <libavcodec/codec_id.h>
 #include <libavcodec/codec_par.h>
+#include <libavutil/avutil.h>
 #include <libavutil/channel_layout.h>
 #include <libavutil/mem.h>
 #include <libavutil/pixfmt.h>
@@ -40,6 +49,29 @@ extern "C"
 
 namespace zonmediatypes
 {
+
+// ---- Time ------------------------------------------------------------------------------------------------------------
+
+/// The time base of a stream; empty unless both terms are positive.
+constexpr std::optional<TimeBase> ToTimeBase(AVRational inSecondsPerUnit) noexcept;
+
+/// The reduced ratio of a time base; empty when a term does not fit 32 bits.
+constexpr std::optional<AVRational> ToAVRational(TimeBase inTimeBase) noexcept;
+
+/// The time of a timestamp; empty for AV_NOPTS_VALUE, an unusable time base, and what does not fit.
+constexpr std::optional<TickTime> ToTickTime(
+	std::int64_t inTimestamp, AVRational inTimeBase, Rounding inRounding) noexcept;
+
+/// The timestamp of a time; AV_NOPTS_VALUE for kTime_Invalid, an unusable time base, and what does not fit.
+constexpr std::int64_t ToTimestamp(TickTime inTime, AVRational inTimeBase, Rounding inRounding) noexcept;
+
+/// The rate of that many frames a second. A numerator of 0, by which FFmpeg says that a rate is not known, is
+/// kFrameRate_Zero; empty for a negative rate, a denominator of 0, and a frame that is no whole number of ticks.
+constexpr std::optional<FrameRate> ToFrameRate(AVRational inFramesPerSecond) noexcept;
+
+/// The frames a second in lowest terms, 0/1 for kFrameRate_Zero; empty for a duration of 0 or below and when a term does
+/// not fit 32 bits.
+constexpr std::optional<AVRational> ToAVRational(FrameRate inRate) noexcept;
 
 // ---- Audio -----------------------------------------------------------------------------------------------------------
 
@@ -126,6 +158,13 @@ AVRational ToSampleAspectRatio(PixelAspectRatio inRatio);
 
 namespace detail
 {
+
+constexpr std::optional<AVRational> NarrowRatio(std::int64_t inNumerator, std::int64_t inDenominator) noexcept
+{
+	if (!std::in_range<int>(inNumerator) || !std::in_range<int>(inDenominator))
+		return std::nullopt;
+	return AVRational{static_cast<int>(inNumerator), static_cast<int>(inDenominator)};
+}
 
 constexpr AudioChannelLabel LabelOfRole(AVChannel inChannel)
 {
@@ -224,6 +263,49 @@ inline AVChannelLayout MappedLayout(const std::vector<AVChannel>& inSpeakers)
 }
 
 }   // namespace detail
+
+constexpr std::optional<TimeBase> ToTimeBase(AVRational inSecondsPerUnit) noexcept
+{
+	return TimeBase::FromRatio(inSecondsPerUnit.num, inSecondsPerUnit.den);
+}
+
+constexpr std::optional<AVRational> ToAVRational(TimeBase inTimeBase) noexcept
+{
+	const auto ratio = inTimeBase.ToRatio();
+	return ratio ? detail::NarrowRatio(ratio->mNumerator, ratio->mDenominator) : std::nullopt;
+}
+
+constexpr std::optional<TickTime> ToTickTime(
+	std::int64_t inTimestamp, AVRational inTimeBase, Rounding inRounding) noexcept
+{
+	const auto base = ToTimeBase(inTimeBase);
+	return base && inTimestamp != AV_NOPTS_VALUE ? base->ToTicks(inTimestamp, inRounding) : std::nullopt;
+}
+
+constexpr std::int64_t ToTimestamp(TickTime inTime, AVRational inTimeBase, Rounding inRounding) noexcept
+{
+	const auto base = ToTimeBase(inTimeBase);
+	return base && inTime != kTime_Invalid ? base->FromTicks(inTime, inRounding).value_or(AV_NOPTS_VALUE)
+										   : AV_NOPTS_VALUE;
+}
+
+constexpr std::optional<FrameRate> ToFrameRate(AVRational inFramesPerSecond) noexcept
+{
+	if (inFramesPerSecond.num == 0 && inFramesPerSecond.den != 0)
+		return kFrameRate_Zero;
+	const auto base = TimeBase::FromRatio(inFramesPerSecond.den, inFramesPerSecond.num);
+	const auto ticks = base && base->IsExact() ? base->ToTicks(1, Rounding::TowardZero) : std::nullopt;
+	return ticks ? std::optional(FrameRate(ticks->GetTicks())) : std::nullopt;
+}
+
+constexpr std::optional<AVRational> ToAVRational(FrameRate inRate) noexcept
+{
+	if (inRate == kFrameRate_Zero)
+		return AVRational{0, 1};
+	const auto base = TimeBase::FromRate(inRate);
+	const auto ratio = base ? base->ToRatio() : std::nullopt;
+	return ratio ? detail::NarrowRatio(ratio->mDenominator, ratio->mNumerator) : std::nullopt;
+}
 
 inline AudioChannelLayout ToAudioChannelLayout(const AVChannelLayout& inLayout)
 {

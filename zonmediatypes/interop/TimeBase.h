@@ -44,6 +44,15 @@ public:
 	constexpr std::optional<std::int64_t> FromTicks(TickTime inTime, Rounding inRounding) const noexcept;
 	constexpr std::optional<TickTime> ToTicks(std::int64_t inUnits, Rounding inRounding) const noexcept;
 
+	/// The seconds that a unit lasts, in lowest terms; empty when the denominator does not fit 64 bits.
+	struct Ratio
+	{
+		std::int64_t mNumerator, mDenominator;
+
+		friend constexpr bool operator==(const Ratio&, const Ratio&) noexcept = default;
+	};
+	constexpr std::optional<Ratio> ToRatio() const noexcept;
+
 	/// Whether every unit is a whole number of ticks: ToTicks then rounds nothing.
 	constexpr bool IsExact() const noexcept { return mUnits == 1; }
 
@@ -112,6 +121,15 @@ constexpr std::optional<TimeBase> TimeBase::FromRate(FrameRate inRate) noexcept
 	if (!inRate.IsUsable() || inRate.GetTicksPerFrame() < 0)
 		return std::nullopt;
 	return TimeBase(inRate.GetTicksPerFrame(), 1);
+}
+
+constexpr std::optional<TimeBase::Ratio> TimeBase::ToRatio() const noexcept
+{
+	const std::int64_t common = std::gcd(mTicks, kTicksPerSecond);
+	std::int64_t denominator = 0;
+	if (__builtin_mul_overflow(kTicksPerSecond / common, mUnits, &denominator))
+		return std::nullopt;
+	return Ratio{mTicks / common, denominator};
 }
 
 constexpr std::optional<std::int64_t> TimeBase::FromTicks(TickTime inTime, Rounding inRounding) const noexcept
