@@ -152,6 +152,7 @@ TEST(ZString, FillsPlaceholdersInOnePass)
 	EXPECT_EQ(Fill("@@0@", {one}), "@one@");
 	EXPECT_EQ(Fill("@10", {at, one}), "one0");
 	EXPECT_EQ(Fill("@0@2@9@x @", {one, one}), "one@2@9@x @");
+	EXPECT_EQ(Fill("\u00E9@0 \u2026@1", {one, one}), "\u00E9one \u2026one");
 	EXPECT_EQ(Fill("@0", {{}}), "");
 	EXPECT_EQ(Fill("@0", {}), "@0");
 	EXPECT_EQ(Fill("no placeholders", {one, one}), "no placeholders");

@@ -35,6 +35,12 @@ public:
 	/// any thread.
 	UTF16String Lookup(std::string_view inKey) const;
 
+	/// The same with inEnglish, the text behind the first "=", at hand: saves the search for it.
+	UTF16String Lookup(std::string_view inKey, std::string_view inEnglish) const;
+
+	/// The same with its placeholders filled, see FillPlaceholders; cheaper than filling the text that Lookup gives.
+	UTF16String Lookup(std::string_view inKey, std::span<const UTF16String> inReplacements) const;
+
 	/// Installs inTranslator; an empty one removes it. Safe while other threads look up: a look-up that has begun ends
 	/// with the translator it began with.
 	void SetTranslator(Translator inTranslator);
@@ -66,7 +72,7 @@ public:
 	{
 	}
 	ZString(std::string_view inKey, std::span<const UTF16String> inReplacements)
-		: mText(FillPlaceholders(config::Localizer::Get().Lookup(inKey), inReplacements))
+		: mText(config::Localizer::Get().Lookup(inKey, inReplacements))
 	{
 	}
 

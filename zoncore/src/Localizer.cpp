@@ -33,13 +33,48 @@ bool Translate(std::string_view inKey, UTF16String& outText)
 	}
 }
 
-constexpr UTF16Char kPlaceholderMark = '@';
-
-// Which replacement the mark at the start of inText asks for; past the end of any list when no digit follows it.
-std::size_t PlaceholderIndex(UTF16StringView inText)
+// The text of a key in UTF-8 when the host has none: that of the catalogue, if there is one, or the English text.
+std::string_view TextOf(const config::MessageCatalogue* inCatalogue, std::string_view inKey, std::string_view inEnglish)
 {
-	const bool hasDigit = inText.size() > 1 && inText[1] >= '0' && inText[1] <= '9';
-	return hasDigit ? static_cast<std::size_t>(inText[1] - '0') : UTF16StringView::npos;
+	const std::string_view translation = inCatalogue != nullptr ? inCatalogue->Find(inKey) : std::string_view();
+	return translation.empty() ? inEnglish : translation;
+}
+
+// Takes a template of UTF-16 or of ASCII apart: calls inChar for each character that stays, inText for each replacement.
+template <class Char, class OnChar, class OnText>
+void TakeApart(
+	std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements, OnChar inChar, OnText inText)
+{
+	for (const Char *next = inTemplate.data(), *const end = next + inTemplate.size(); next != end; ++next)
+	{
+		const std::size_t index = *next == '@' && next + 1 != end ? static_cast<std::size_t>(next[1]) - '0' : 10;
+		if (index >= 10 || index >= inReplacements.size())
+		{
+			inChar(static_cast<UTF16Char>(*next));
+			continue;
+		}
+		inText(inReplacements[index]);
+		++next;
+	}
+}
+
+template <class Char>
+UTF16String Fill(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
+{
+	std::size_t length = 0;
+	TakeApart(
+		inTemplate, inReplacements, [&](UTF16Char) { ++length; },
+		[&](const UTF16String& inText) { length += inText.size(); });
+	UTF16String filled(length, 0);
+	UTF16Char* end = filled.data();
+	TakeApart(
+		inTemplate, inReplacements, [&](UTF16Char inChar) { *end++ = inChar; },
+		[&](const UTF16String& inText)
+		{
+			for (const UTF16Char unit : inText)   // most are too short for memcpy to pay
+				*end++ = unit;
+		});
+	return filled;
 }
 
 }   // namespace
@@ -52,12 +87,27 @@ config::Localizer& config::Localizer::Get() noexcept
 
 UTF16String config::Localizer::Lookup(std::string_view inKey) const
 {
+	return Lookup(inKey, EnglishText(inKey));
+}
+
+UTF16String config::Localizer::Lookup(std::string_view inKey, std::string_view inEnglish) const
+{
 	UTF16String text;
 	if (Translate(inKey, text))
 		return text;
 	const auto catalogue = sCatalogue.Get();
-	const std::string_view translation = catalogue ? catalogue->Find(inKey) : std::string_view();
-	return utility::UTF8to16(translation.empty() ? EnglishText(inKey) : translation);
+	return utility::UTF8to16(TextOf(catalogue.get(), inKey, inEnglish));
+}
+
+UTF16String config::Localizer::Lookup(std::string_view inKey, std::span<const UTF16String> inReplacements) const
+{
+	UTF16String text;
+	if (Translate(inKey, text))
+		return FillPlaceholders(text, inReplacements);
+	const auto catalogue = sCatalogue.Get();
+	const std::string_view pattern = TextOf(catalogue.get(), inKey, EnglishText(inKey));
+	const bool isAscii = std::ranges::all_of(pattern, [](unsigned char inByte) { return inByte < 0x80; });
+	return isAscii ? Fill(pattern, inReplacements) : FillPlaceholders(utility::UTF8to16(pattern), inReplacements);
 }
 
 void config::Localizer::SetTranslator(Translator inTranslator)
@@ -72,21 +122,7 @@ void config::Localizer::SetCatalogue(const std::shared_ptr<const MessageCatalogu
 
 UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements)
 {
-	UTF16String text;
-	text.reserve(inTemplate.size());
-	while (!inTemplate.empty())
-	{
-		const std::size_t plain = std::min(inTemplate.find(kPlaceholderMark), inTemplate.size());
-		text.append(inTemplate.substr(0, plain));
-		inTemplate.remove_prefix(plain);
-		if (inTemplate.empty())
-			break;
-		const std::size_t index = PlaceholderIndex(inTemplate);
-		const bool isFilled = index < inReplacements.size();
-		text.append(isFilled ? UTF16StringView(inReplacements[index]) : inTemplate.substr(0, 1));
-		inTemplate.remove_prefix(isFilled ? 2 : 1);
-	}
-	return text;
+	return Fill(inTemplate, inReplacements);
 }
 
 }   // namespace zoncore

@@ -48,11 +48,13 @@ UTF16String TimeDisplayDescription(TimeDisplay inDisplay)
 namespace
 {
 
-// The localised text of a key of inLabel's row; empty, and no key looked up, for a number that names no label.
-UTF16String LabelText(std::span<const std::string_view> inKeys, AudioChannelLabel inLabel)
+// The localised form of one of a label's English texts, by its key; empty, and no key looked up, for a number that names no
+// label.
+UTF16String LabelText(AudioChannelLabel inLabel, std::string_view AudioChannelLabelRow::*inEnglish,
+	std::span<const std::string_view> inKeys)
 {
 	const AudioChannelLabelRow* const row = FindLabelRow(inLabel);
-	return row != nullptr ? Localizer::Get().Lookup(inKeys[IndexOf(*row)]) : UTF16String();
+	return row != nullptr ? Localizer::Get().Lookup(inKeys[IndexOf(*row)], row->*inEnglish) : UTF16String();
 }
 
 bool HasLabels(const AudioChannelLayout& inLayout, std::span<const AudioChannelLabel> inLabels)
@@ -80,26 +82,32 @@ std::string_view LayoutKey(const AudioChannelLayout& inLayout)
 // The name of a layout by the abbreviations of its first channels, with the channel count before them when there are more.
 UTF16String ListChannels(const AudioChannelLayout& inLayout)
 {
-	std::array<UTF16String, kChannelsKeys.size()> texts;
-	auto end = texts.begin();
-	if (inLayout.size() > texts.size())
-		*end++ = IntegerToString(inLayout.size());
-	for (auto channel = inLayout.begin(); channel != inLayout.end() && end != texts.end(); ++channel)
-		*end++ = AudioChannelLabelAbbreviations(channel->mLabel);
-	return ZString(LayoutKey(inLayout), std::span(texts.begin(), end));
+	constexpr std::size_t kTexts = kChannelsKeys.size();
+	const std::size_t counts = inLayout.size() > kTexts ? 1 : 0;
+	const auto text = [&](std::size_t inIndex)
+	{
+		if (inIndex < counts)
+			return IntegerToString(inLayout.size());
+		const std::size_t channel = inIndex - counts;
+		return channel < inLayout.size() ? AudioChannelLabelAbbreviations(inLayout[channel].mLabel) : UTF16String();
+	};
+	const std::array<UTF16String, kTexts> texts{text(0), text(1), text(2), text(3), text(4), text(5), text(6), text(7)};
+	return ZString(LayoutKey(inLayout), std::span(texts).first(std::min(inLayout.size() + counts, kTexts)));
 }
 
 }   // namespace
 
 UTF16String AudioChannelLabelDescription(AudioChannelLabel inLabel, bool inWithMnemonic)
 {
-	return LabelText(inWithMnemonic ? kLabelMnemonicKeys : kLabelDescriptionKeys, inLabel);
+	return inWithMnemonic ? LabelText(inLabel, &AudioChannelLabelRow::mMnemonic, kLabelMnemonicKeys)
+						  : LabelText(inLabel, &AudioChannelLabelRow::mEnglish, kLabelDescriptionKeys);
 }
 
 UTF16String AudioChannelLabelAbbreviations(AudioChannelLabel inLabel)
 {
-	return inLabel == kAudioChannelLabel_Discrete ? AudioChannelLabelAbbreviationsUnlocalized(inLabel)
-												  : LabelText(kLabelAbbreviationKeys, inLabel);
+	return inLabel == kAudioChannelLabel_Discrete
+		? AudioChannelLabelAbbreviationsUnlocalized(inLabel)
+		: LabelText(inLabel, &AudioChannelLabelRow::mAbbreviation, kLabelAbbreviationKeys);
 }
 
 UTF16String AudioChannelLabelAbbreviationsUnlocalized(AudioChannelLabel inLabel)
