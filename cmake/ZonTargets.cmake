@@ -6,7 +6,7 @@ if(ZON_WARNINGS_AS_ERRORS)
 endif()
 
 # Floating-point results are compared bit for bit: a contracted multiply-add rounds once where the formulas round twice.
-set(ZON_CODE_OPTIONS -ffp-contract=off)
+set(ZON_CODE_OPTIONS -ffp-contract=off -fno-semantic-interposition)
 
 # Options that every target of the project shares, libraries and programs alike.
 function(zon_target_defaults inTarget)
