@@ -1,0 +1,152 @@
+// Pixel formats of any properties, rectangles and ratios of any integers.
+
+#include "FuzzInput.h"
+#include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PixelAspectRatioUtils.h"
+#include "zonmediatypes/PixelFormatSelection.h"
+#include "zonmediatypes/PixelFormatSize.h"
+#include "zonmediatypes/PixelFormatUtils.h"
+
+#include <algorithm>
+#include <iterator>
+
+namespace
+{
+
+using namespace zonmediatypes;
+using zonfuzz::FuzzInput;
+using zonfuzz::Require;
+
+PixelFormat TakeFormat(FuzzInput& ioInput)
+{
+	const std::size_t index = ioInput.Below(128);
+	const auto count = static_cast<std::size_t>(AllPixelFormatsEnd() - AllPixelFormatsBegin());
+	if (index < count)
+		return AllPixelFormatsBegin()[index];
+	return {static_cast<PixelFormatName>(ioInput.Any<std::uint32_t>()),
+		PixelFormatProperties(ioInput.Any<std::uint32_t>())};
+}
+
+PixelFormats TakeFormats(FuzzInput& ioInput)
+{
+	PixelFormats formats(ioInput.Below(5));
+	for (PixelFormat& format : formats)
+		format = TakeFormat(ioInput);
+	return formats;
+}
+
+RenderQuality TakeQuality(FuzzInput& ioInput)
+{
+	return static_cast<RenderQuality>(ioInput.Any<std::int8_t>() % 8);
+}
+
+void CheckProperties(FuzzInput& ioInput)
+{
+	PixelFormatProperties properties(ioInput.Any<std::uint32_t>());
+	const PixelFormatProperties before = properties;
+	const auto code = ioInput.Any<std::uint32_t>();
+	properties.SetBitDepth(code);
+	properties.SetAlpha(code);
+	properties.SetSubsampling(code);
+	properties.SetCompression(code);
+	properties.SetKind(code);
+	Require(properties.BitDepth() == code % 8 && properties.Alpha() == code % 8 && properties.Subsampling() == code % 4
+			&& properties.Compression() == code % 16 && properties.Kind() == code % 4,
+		"a field keeps what it has room for");
+	properties.SetBitDepth(before.BitDepth());
+	properties.SetAlpha(before.Alpha());
+	properties.SetSubsampling(before.Subsampling());
+	properties.SetCompression(before.Compression());
+	properties.SetKind(before.Kind());
+	Require(properties == before, "fields do not touch each other");
+
+	const PixelFormatName name = GuessNameForProperties(before);
+	const bool isNamed = name != kPixelFormatFourCC_Any && name != kPixelFormatFourCC_Invalid;
+	Require(!isNamed || LookupPropertiesForName(name) == before, "a name that is guessed stands for the properties");
+	const PixelFormat format = TakeFormat(ioInput);
+	static_cast<void>(LookupPropertiesForName(format.mName));
+	static_cast<void>(PixelFormatDescription(format));
+	Require(PixelFormatCatalogueName(format).size() < 100, "catalogue names are short");
+}
+
+void CheckSelection(FuzzInput& ioInput)
+{
+	const RenderQuality quality = TakeQuality(ioInput);
+	const PixelFormats sources = TakeFormats(ioInput), destinations = TakeFormats(ioInput);
+	const PixelFormat request = TakeFormat(ioInput);
+	const int cost = PixelConversionCost(request.mProperties, TakeFormat(ioInput).mProperties, quality);
+	Require(cost >= 0 && cost <= kPixelConversionCost_Impossible, "costs are in their range");
+
+	const PixelFormat nearest = SelectNearestSourcePixelFormat(sources, request.mProperties, quality);
+	Require(
+		nearest == kPixelFormat_Invalid || std::count(sources.begin(), sources.end(), nearest) > 0, "a source format");
+	static_cast<void>(SelectNearestPixelFormat(sources, request, destinations, quality, ioInput.Flag()));
+	static_cast<void>(Select4444PixelFormat(request, quality));
+	const PixelFormat decompressed = SelectDVDecompressionFormat(request);
+	Require(decompressed == request || (request.mProperties.IsDV() && !decompressed.mProperties.IsCompressed()),
+		"only DV is decompressed");
+}
+
+void CheckSizes(FuzzInput& ioInput)
+{
+	const PixelFormat format = TakeFormat(ioInput);
+	const auto width = ioInput.Edge<std::int32_t>(), height = ioInput.Edge<std::int32_t>();
+	const bool isOrdinary = width > 0 && width < 16'384 && height > 0 && height < 16'384;
+	const std::int64_t size = PixelFormatSize(format, width, height);
+	const std::int64_t row = UncompressedPixelFormatRowBytes(format, width);
+	Require(!isOrdinary || (size >= 0 && row >= 0), "ordinary frames have a size");
+	int fixedWidth = -1, fixedHeight = -2;
+	FixedSizedFormatDimensions(format, fixedWidth, fixedHeight);
+	Require(format.mProperties.IsDV() ? fixedWidth > 0 && fixedHeight > 0 : fixedWidth == -1 && fixedHeight == -2,
+		"only DV has a size of its own");
+	static_cast<void>(
+		IsRectValidForFormat(format, width, height, {ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>()}));
+}
+
+void CheckRatios(FuzzInput& ioInput)
+{
+	const PixelAspectRatio a(ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>());
+	const PixelAspectRatio b = ioInput.Flag() ? ioInput.OneOf(AllPixelAspectRatios())
+											  : PixelAspectRatio(ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>());
+	Require(a == a && !(a < a), "a ratio equals itself");
+	Require((a == b) == (b == a) && (a < b) == (b > a) && !(a < b && a >= b), "comparisons have two sides");
+	const PixelAspectRatio corrected = CorrectLegacyPixelAspectRatio(a);
+	Require(IsLegacyPixelAspectRatio(a) == (corrected != a), "only legacy ratios are corrected");
+	Require(!PixelAspectRatioDescription(a).empty() && !a.GetDisplayString().empty(), "every ratio has a description");
+
+	const zoncore::RectT<int> first{0, 0, ioInput.Edge<int>(), ioInput.Edge<int>()};
+	const zoncore::RectT<int> second{ioInput.Edge<int>(), 0, ioInput.Edge<int>(), ioInput.Edge<int>()};
+	static_cast<void>(AdjustPixelAspectRatioForNonUniformDownsample(a, first, second));
+	const auto square = AdjustPixelAspectRectToSquarePixelRect(second, a);
+	Require(
+		square.left == second.left && square.top == second.top && square.bottom == second.bottom, "only widths change");
+	const auto size = AdjustPixelAspectDimensionToSquarePixelDimension({second.right, second.bottom}, a);
+	Require(size.x == square.right && size.y == square.bottom, "sizes change as rectangles do");
+	const auto other = AdjustSquarePixelRectToPixelAspectRect(second, a);
+	const auto otherSize = AdjustSquarePixelDimensionToPixelAspectDimension({second.right, second.bottom}, a);
+	Require(otherSize.x == other.right && otherSize.y == second.bottom, "and back");
+	Require(!VideoFrameSizeDescription(second, a).empty(), "every frame size has a description");
+}
+
+}   // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
+{
+	FuzzInput input(inData, inSize);
+	switch (input.Below(4))
+	{
+	case 0:
+		CheckProperties(input);
+		break;
+	case 1:
+		CheckSelection(input);
+		break;
+	case 2:
+		CheckSizes(input);
+		break;
+	case 3:
+		CheckRatios(input);
+		break;
+	}
+	return 0;
+}
