@@ -82,8 +82,8 @@ void CheckRoundTrip(FuzzInput& ioInput)
 	const bool isCount = display == kTimeDisplay_Frames || IsFeet(display);
 	if (isCount && time.ToFrame64(rate) != time.ToFrame32(rate))
 		return;   // counts that are read end at 32 bits
-	const unsigned trim = ioInput.Flag() ? kTimecodeFlag_TrimLeadingZeros : 0;
-	const UTF16String text = TimeToTimecode(time, rate, display, kTimecodeFlag_ShowSign | trim);
+	const TimecodeFlags trim = ioInput.Flag() ? TimecodeFlags(kTimecodeFlag_TrimLeadingZeros) : TimecodeFlags();
+	const UTF16String text = TimeToTimecode(time, rate, display, trim | kTimecodeFlag_ShowSign);
 	time.AlignToFrame(rate);
 	Require(TimecodeToTime(text, rate, display) == time, "a time that is written reads back as its frame");
 }
