@@ -1,5 +1,5 @@
-#include "HostileLocale.h"
-#include "zoncore/Localizer.h"
+#include "tests/HostileLocale.h"
+#include "tests/KeyRecorder.h"
 #include "zoncore/StringUtils.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/FrameRate.h"
@@ -10,7 +10,6 @@
 #include <limits>
 #include <string>
 #include <tuple>
-#include <utility>
 #include <vector>
 
 namespace zonmediatypes
@@ -18,32 +17,8 @@ namespace zonmediatypes
 namespace
 {
 
-using zoncore::utility::AsciiToUTF16;
 using zoncore::utility::UTF16to8;
-
-// A translator that writes down which keys it is asked for.
-class KeyRecorder
-{
-public:
-	explicit KeyRecorder(std::string inTranslation = {})
-	{
-		zoncore::config::Localizer::Get().SetTranslator(
-			[this, inTranslation](std::string_view inKey, zoncore::UTF16String& outText)
-			{
-				mKeys.emplace_back(inKey);
-				outText = AsciiToUTF16(inTranslation);
-				return !inTranslation.empty();
-			});
-	}
-	KeyRecorder(const KeyRecorder&) = delete;
-	KeyRecorder& operator=(const KeyRecorder&) = delete;
-	~KeyRecorder() { zoncore::config::Localizer::Get().SetTranslator({}); }
-
-	std::vector<std::string> TakeKeys() { return std::exchange(mKeys, {}); }
-
-private:
-	std::vector<std::string> mKeys;
-};
+using zontest::KeyRecorder;
 
 std::string Describe(std::int64_t inTicksPerFrame)
 {
