@@ -8,6 +8,9 @@ endif()
 # Floating-point results are compared bit for bit: a contracted multiply-add rounds once where the formulas round twice.
 set(ZON_CODE_OPTIONS -ffp-contract=off -fno-semantic-interposition)
 
+# zonmediatypes::Initialize() as linkers know it.
+set(ZON_ENTRY_POINT _ZN13zonmediatypes10InitializeEv)
+
 # Options that every target of the project shares, libraries and programs alike.
 function(zon_target_defaults inTarget)
 	target_compile_features(${inTarget} PUBLIC cxx_std_20)

@@ -1,3 +1,4 @@
+#include "zoncore/CheckRegistry.h"
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
 #include "zonmediatypes/FrameRate.h"
@@ -5,12 +6,13 @@
 #include "zonmediatypes/Version.h"
 #include "zonmediatypes/ZONMediaTypes.h"
 
+#include <algorithm>
 #include <iomanip>
 #include <iostream>
 #include <string_view>
 
 // Uses what can go wrong between a program and the library: both libraries, inline and compiled functions, a 16-bit stream
-// across the boundary, an exception thrown inside.
+// across the boundary, an exception thrown inside, what registers itself at load.
 int main()
 {
 	using namespace zonmediatypes;
@@ -31,8 +33,10 @@ int main()
 		caught = std::string_view(error.what()) == "as expected";
 	}
 
-	const bool isRight
-		= std::string_view(Version()) == ZONMEDIATYPES_VERSION_STRING && text == "29.97  1800 1.5" && caught;
+	const auto suites = zoncore::CheckRegistry::Get().GetSuites();
+	const bool isRegistered = std::ranges::count(suites, "ZON.MediaTypes") == 1;
+	const bool isRight = std::string_view(Version()) == ZONMEDIATYPES_VERSION_STRING && text == "29.97  1800 1.5"
+		&& caught && isRegistered;
 	std::cout << Version() << ": " << text << (isRight ? "" : " is wrong") << '\n';
 	return isRight ? 0 : 1;
 }

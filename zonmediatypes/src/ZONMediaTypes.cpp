@@ -2,6 +2,7 @@
 
 #include "zoncore/RecursiveMutex.h"
 #include "zonmediatypes/src/InitializationCount.h"
+#include "zonmediatypes/src/SelfCheck.h"
 
 namespace zonmediatypes
 {
@@ -10,6 +11,10 @@ namespace
 
 zoncore::threads::RecursiveMutex sCriticalSection;
 std::int32_t sInitializationCount;
+
+// At load. It stands beside the entry points because a static link takes what they stand in, and leaves out an object
+// file that nothing refers to.
+[[maybe_unused]] const bool sHasSelfChecks = (RegisterSelfChecks(), true);
 
 // Holds sCriticalSection for the length of a block.
 class CriticalSectionLock
