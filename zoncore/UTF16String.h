@@ -124,8 +124,8 @@ public:
 	ClassicUTF16Stream(const UTF16String& inText, std::ios_base::openmode inMode) : Stream(inText, inMode) { Imbue(); }
 
 	// Written out: the virtual base of streams does not move by itself, the standard streams move what it holds.
-	ClassicUTF16Stream(ClassicUTF16Stream&& ioOther) : Stream(std::move(ioOther)) {}
-	ClassicUTF16Stream& operator=(ClassicUTF16Stream&& ioOther)
+	ClassicUTF16Stream(ClassicUTF16Stream&& ioOther) noexcept : Stream(std::move(ioOther)) {}
+	ClassicUTF16Stream& operator=(ClassicUTF16Stream&& ioOther) noexcept
 	{
 		Stream::operator=(std::move(ioOther));
 		return *this;

@@ -5,8 +5,6 @@
 #include <algorithm>
 #include <array>
 #include <csignal>
-#include <cstdarg>
-#include <cstddef>
 #include <cstdio>
 #include <fcntl.h>
 #include <string_view>
@@ -23,20 +21,18 @@ constinit Hook<bool(std::atomic<bool>&, const char*, const char*, const char*, i
 
 // Writes one line at once, so that lines of several threads do not mix. Line breaks inside become blanks, those at the
 // end go, and what is too long for anybody to read is cut off.
-[[gnu::format(printf, 1, 2)]] void PrintLine(const char* inFormat, ...)
+template <class... Arguments>
+void PrintLine(const char* inFormat, Arguments... inArguments)
 {
 	constexpr int kLongestLine = 1'000;
 	std::array<char, kLongestLine + 2> line{};   // and a line break and the end
-	std::va_list arguments;
-	va_start(arguments, inFormat);
-	const int length = std::vsnprintf(line.data(), kLongestLine + 1, inFormat, arguments);
-	va_end(arguments);
+	const int length = std::snprintf(line.data(), kLongestLine + 1, inFormat, inArguments...);
 	if (length < 0)
 		return;
-	auto end = line.begin() + std::min(length, kLongestLine);
-	while (end != line.begin() && end[-1] == '\n')
+	char* end = line.data() + std::min(length, kLongestLine);
+	while (end != line.data() && end[-1] == '\n')
 		--end;
-	std::replace(line.begin(), end, '\n', ' ');
+	std::replace(line.data(), end, '\n', ' ');
 	end[0] = '\n';
 	end[1] = '\0';
 	std::fputs(line.data(), stderr);

@@ -192,9 +192,9 @@ double ReadDecimal(UTF16StringView inText)
 {
 	const auto isMark = [](UTF16Char inChar) { return (inChar | 0x20) == 'e'; };
 	const auto isSignificant = [](UTF16Char inChar) { return inChar >= '1' && inChar <= '9'; };
-	const auto mark = std::ranges::find_if(inText, isMark);
-	const auto point = std::find(inText.begin(), mark, UTF16Char{'.'});
-	const auto first = std::find_if(inText.begin(), mark, isSignificant);
+	const UTF16Char* const mark = std::ranges::find_if(inText, isMark);
+	const UTF16Char* const point = std::find(inText.begin(), mark, UTF16Char{'.'});
+	const UTF16Char* const first = std::find_if(inText.begin(), mark, isSignificant);
 	if (first == mark)
 		return 0;
 	const std::int64_t place = first < point ? point - first : point - first + 1;
@@ -206,8 +206,7 @@ double ReadDecimal(UTF16StringView inText)
 
 constexpr std::int64_t kLargestTerm = 2'147'483'646;
 
-__extension__ typedef unsigned __int128
-	Wide;   // NOLINT(modernize-use-using): an alias declaration takes no __extension__
+__extension__ using Wide = unsigned __int128;
 
 // The value to come near to, exactly.
 struct Target

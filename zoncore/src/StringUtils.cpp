@@ -152,7 +152,7 @@ UTF16String AsciiToUTF16(std::string_view inText)
 UTF16String UTF8to16(std::string_view inText)
 {
 	if (CountAscii(inText) == inText.size())
-		return UTF16String(inText.begin(), inText.end());
+		return {inText.begin(), inText.end()};
 	// No form of a code point has more code units in UTF-16 than bytes in UTF-8, and nor has U+FFFD for an ill-formed piece.
 	UTF16String text(inText.size(), 0);
 	UTF16Char* end = text.data();
