@@ -43,7 +43,8 @@ public:
 	virtual ~AudioFormat();
 
 	/// A format of 32-bit samples. 2 and 6 channels are labelled L R and L R C LFE Ls Rs, any other number of channels is
-	/// `Discrete`, deliberately also 1, 4 and 8. Rates above 2147483647 are stored modulo 2^32.
+	/// `Discrete`, deliberately also 4 and 8, which CreateMultichannelLayoutWithDefaultLabels labels. Rates above 2147483647
+	/// are stored modulo 2^32.
 	static AudioFormat CreateDefaultAudioFormat(std::uint32_t inChannelCount, std::uint32_t inSampleRate);
 	/// The same with the channels of inLayout.
 	static AudioFormat CreateAudioFormat(const AudioChannelLayout& inLayout, std::uint32_t inSampleRate);

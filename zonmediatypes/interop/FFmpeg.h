@@ -121,6 +121,7 @@ inline constexpr auto kAVChannelRoles = std::to_array<AVChannelRole>({
 
 /// The layout of a stream. Channels keep their order and are known by their speakers: what is no speaker of the table is
 /// `Discrete`, and so are all channels of a layout of which only their number is known. A lone centre is mono: `Discrete`.
+/// 7.1 has the rear pair before the side pair, other than Create7_1ItuChannelLayout(): RemapChannelOrdering() tells how.
 /// An invalid layout gives an empty one.
 AudioChannelLayout ToAudioChannelLayout(const AVChannelLayout& inLayout);
 
