@@ -143,7 +143,8 @@ struct std::hash<zoncore::UTF16String>
 {
 	std::size_t operator()(const zoncore::UTF16String& inText) const noexcept
 	{
-		return std::hash<std::string_view>()(
-			std::string_view(reinterpret_cast<const char*>(inText.data()), inText.size() * sizeof(zoncore::UTF16Char)));
+		// NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): every object may be read as bytes
+		const auto* const bytes = reinterpret_cast<const char*>(inText.data());
+		return std::hash<std::string_view>()({bytes, inText.size() * sizeof(zoncore::UTF16Char)});
 	}
 };

@@ -51,8 +51,8 @@ namespace zoncore::detail
 inline std::string HexText(std::uint64_t inNumber)
 {
 	std::array<char, 16> digits{};
-	const auto end = std::to_chars(digits.begin(), digits.end(), inNumber, 16).ptr;
-	return "0x" + std::string(digits.begin(), end);
+	const char* const end = std::to_chars(digits.data(), digits.data() + digits.size(), inNumber, 16).ptr;
+	return "0x" + std::string(digits.data(), end);
 }
 
 /// What inWrite writes to a stream with default settings.
