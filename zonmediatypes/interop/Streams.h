@@ -51,7 +51,7 @@ namespace zoncore::detail
 inline std::string HexText(std::uint64_t inNumber)
 {
 	std::array<char, 16> digits{};
-	const char* const end = std::to_chars(digits.data(), digits.data() + digits.size(), inNumber, 16).ptr;
+	char* const end = std::to_chars(digits.data(), digits.data() + digits.size(), inNumber, 16).ptr;
 	return "0x" + std::string(digits.data(), end);
 }
 
