@@ -20,11 +20,6 @@ constexpr bool IsHighQuality(RenderQuality inQuality)
 //
 // A sum of small answers, one for each way in which formats differ.
 
-constexpr bool CanConvert(PixelFormatProperties inFormat)
-{
-	return inFormat.IsConcrete() && !inFormat.HasUnknownCompression();
-}
-
 constexpr int ModelCost(PixelFormatProperties inFrom, PixelFormatProperties inTo, RenderQuality inQuality)
 {
 	if (inFrom.IsYUV() == inTo.IsYUV())
@@ -68,8 +63,10 @@ constexpr int AlphaCost(PixelFormatProperties inFrom, PixelFormatProperties inTo
 
 constexpr int LayoutCost(PixelFormatProperties inFrom, PixelFormatProperties inTo)
 {
-	return int{inFrom.ReversedOrder() != inTo.ReversedOrder()} + int{inFrom.IsLinear() != inTo.IsLinear()}
-	+ int{inFrom.IsFloat() != inTo.IsFloat()};
+	const int order = inFrom.ReversedOrder() != inTo.ReversedOrder();
+	const int light = inFrom.IsLinear() != inTo.IsLinear();
+	const int type = inFrom.IsFloat() != inTo.IsFloat();
+	return order + light + type;
 }
 
 int ChromaCost(PixelFormatProperties inFrom, PixelFormatProperties inTo)
@@ -85,11 +82,11 @@ int ChromaCost(PixelFormatProperties inFrom, PixelFormatProperties inTo)
 
 int ConversionCost(PixelFormatProperties inFrom, PixelFormatProperties inTo, RenderQuality inQuality)
 {
-	if (!CanConvert(inFrom) || !CanConvert(inTo))
+	if (!inFrom.IsConcrete() || inFrom.HasUnknownCompression())
 		return kImpossible;
 	if (inFrom == inTo)
 		return 0;
-	if (inTo.IsCompressed())
+	if (!inTo.IsConcrete() || inTo.IsCompressed())   // unknown compression included
 		return kImpossible;
 	const int base = inFrom.IsCompressed() ? 2 : 1;
 	return base + ModelCost(inFrom, inTo, inQuality) + MatrixCost(inFrom, inTo, inQuality) + RangeCost(inFrom, inTo)
