@@ -1,6 +1,6 @@
 #include "zoncore/CheckRegistry.h"
 
-#include "Allocations.h"
+#include "tests/Allocations.h"
 
 #include <gtest/gtest.h>
 

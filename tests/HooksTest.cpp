@@ -2,7 +2,7 @@
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
 
-#include "Allocations.h"
+#include "tests/Allocations.h"
 
 #include <gtest/gtest.h>
 

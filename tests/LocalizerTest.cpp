@@ -1,6 +1,6 @@
 #include "zoncore/Localizer.h"
 
-#include "Allocations.h"
+#include "tests/Allocations.h"
 #include "zoncore/StringUtils.h"
 
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
 #include "zoncore/NumberConversion.h"
 
-#include "Allocations.h"
-#include "HostileLocale.h"
+#include "tests/Allocations.h"
+#include "tests/HostileLocale.h"
 #include "zoncore/StringUtils.h"
 
 #include <boost/multiprecision/cpp_int.hpp>

@@ -1,6 +1,6 @@
 #include "zonmediatypes/TimeConversionUtils.h"
 
-#include "Allocations.h"
+#include "tests/Allocations.h"
 #include "zoncore/Debug.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"

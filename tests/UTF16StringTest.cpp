@@ -1,6 +1,6 @@
 #include "zoncore/UTF16String.h"
 
-#include "HostileLocale.h"
+#include "tests/HostileLocale.h"
 #include "zoncore/StringUtils.h"
 
 #include <gtest/gtest.h>
