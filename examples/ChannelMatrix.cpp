@@ -7,19 +7,20 @@
 #include <iostream>
 
 using namespace zonmediatypes;
+using zoncore::utility::UTF16to8;
 
 namespace
 {
 
 std::string Name(const AudioChannelDescription& inChannel)
 {
-	return zoncore::utility::UTF16to8(AudioChannelLabelAbbreviationsUnlocalized(inChannel.mLabel));
+	return UTF16to8(AudioChannelLabelAbbreviationsUnlocalized(inChannel.mLabel));
 }
 
 void ShowMatrix(const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination)
 {
-	std::cout << zoncore::utility::UTF16to8(AudioChannelLayoutDescription(inSource)) << " into "
-			  << zoncore::utility::UTF16to8(AudioChannelLayoutDescription(inDestination)) << ":\n";
+	std::cout << UTF16to8(AudioChannelLayoutDescription(inSource)) << " into "
+			  << UTF16to8(AudioChannelLayoutDescription(inDestination)) << ":\n";
 	ChannelConversionMatrix matrix;
 	ComputeChannelConversionMatrix(inSource, inDestination, matrix);
 	for (std::size_t row = 0; row < matrix.size(); ++row)

@@ -7,6 +7,7 @@
 #include <iostream>
 
 using namespace zonmediatypes;
+using zoncore::utility::UTF16to8;
 
 int main()
 {
@@ -18,9 +19,8 @@ int main()
 		film.AddFrames(frame, kFilm);
 		bool isSplit = false;
 		const TickTime video = MapPulldownFrameTo2997Frame(film, kVideo, kPulldownCadence_WWSSW, isSplit);
-		std::cout << "film " << zoncore::utility::UTF16to8(TimeToTimecode(film, kFilm, kTimeDisplay_23976Timecode))
-				  << "  video "
-				  << zoncore::utility::UTF16to8(TimeToTimecode(video, kVideo, kTimeDisplay_2997DropTimecode))
+		std::cout << "film " << UTF16to8(TimeToTimecode(film, kFilm, kTimeDisplay_23976Timecode)) << "  video "
+				  << UTF16to8(TimeToTimecode(video, kVideo, kTimeDisplay_2997DropTimecode))
 				  << (isSplit ? "  one field" : "") << '\n';
 	}
 }

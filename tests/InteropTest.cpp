@@ -108,6 +108,7 @@ TEST(Streams, WriteEveryValue)
 {
 	ExpectText(TickTime(kTicksPerSecond * 3 / 2), "1.5");
 	ExpectText(kFrameRate_23976, "23.976");
+	ExpectText(TimeBase::FromRate(kFrameRate_VideoNTSC).value(), "1001/30000 s");
 	ExpectText(kAudioChannelLabel_BackLeft, "Ls");
 	ExpectText(kAudioChannelLabel_Discrete, "*");
 	ExpectText(static_cast<AudioChannelLabel>(120), "label 120");

@@ -23,6 +23,7 @@
 // clang-format off
 template <> struct fmt::formatter<zonmediatypes::TickTime> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::FrameRate> : fmt::ostream_formatter {};
+template <> struct fmt::formatter<zonmediatypes::TimeBase> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::AudioChannelLabel> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::AudioChannelDescription> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::AudioChannelLayout> : fmt::ostream_formatter {};

@@ -22,6 +22,7 @@
 #include "zonmediatypes/PixelFormat.h"
 #include "zonmediatypes/PixelFormatProperties.h"
 #include "zonmediatypes/TimeConversionUtils.h"
+#include "zonmediatypes/interop/TimeBase.h"
 
 #include <algorithm>
 #include <array>
@@ -141,6 +142,14 @@ inline std::string NameText(PixelFormatName inName)
 }
 
 }   // namespace detail
+
+/// The seconds of a unit: "1001/30000 s"; "time base" when they do not fit.
+inline std::ostream& operator<<(std::ostream& inStream, TimeBase inTimeBase)
+{
+	const auto ratio = inTimeBase.ToRatio();
+	return inStream << (ratio ? std::to_string(ratio->mNumerator) + '/' + std::to_string(ratio->mDenominator) + " s"
+							  : "time base");
+}
 
 /// The abbreviation, as in "Ls"; "label 120" for a number that names none.
 inline std::ostream& operator<<(std::ostream& inStream, AudioChannelLabel inLabel)
