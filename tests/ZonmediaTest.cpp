@@ -92,6 +92,48 @@ TEST(Zonmedia, PrintsOneDocument)
 	ExpectFacts(Document({"time", "-", "--rate", "2997/100", "--display", "frames", "--to", "ms"}, "1\nx\n2\n", 1),
 		{{"/times/1/result", "00:00:00.066"}, {"/times/0/rateIsRounded", true},
 			{"/problems/0/input", "line 2: \"x\""}});
+	ExpectFacts(Document({"audio", "layouts"}), {{"/layouts/3/name", "Broadcast51"}, {"/layouts/3/count", 6}});
+	ExpectFacts(Document({"audio", "layout", "l,r,c,lfe,ls,rs,"}),
+		{{"/description", "5.1 (L, R, C, LFE, Ls, Rs)"}, {"/hasLfe", true}, {"/labels/4/leftRight", "Rs"},
+			{"/labels/3/frontBack", nullptr}});
+	ExpectFacts(Document({"audio", "matrix", "Stereo", "Broadcast51"}),
+		{{"/matrix", {{1, 0}, {0, 1}, {0.5, 0.5}, {0, 0}, {1, 0}, {0, 1}}}, {"/untaken", json::array()}});
+	ExpectFacts(Document({"audio", "matrix", "Broadcast51", "L,R"}),
+		{{"/from", "5.1 (L, R, C, LFE, Ls, Rs)"}, {"/untaken", {"C", "LFE", "Ls", "Rs"}}});
+	ExpectFacts(Document({"audio", "map", "Broadcast51", "Legacy51"}),
+		{{"/isReordering", true}, {"/ordering/2/label", "Ls"}, {"/ordering/2/source", 4}});
+	ExpectFacts(
+		Document({"audio", "map", "Stereo", "L_R_C"}), {{"/isReordering", false}, {"/ordering", json::array()}});
+	ExpectFacts(Document({"video", "formats"}),
+		{{"/count", 74}, {"/formats/15/name", "BGRA_4444_8u"}, {"/formats/15/properties", 0x40080},
+			{"/formats/73/code", "Yv1F"}, {"/formats/73/chroma", "4:2:0"}});
+	ExpectFacts(Document({"video", "cost", "VUYA_4444_8u", "bgra", "--quality", "max"}),
+		{{"/cost", 201}, {"/isPossible", true}, {"/to/name", "BGRA_4444_8u"}});
+	ExpectFacts(Document({"video", "cost", "bgra", "NTSCDV25"}), {{"/cost", 10'000}, {"/isPossible", false}});
+	ExpectFacts(Document({"video", "nearest", "--from", "NTSCDV25", "--to", "VUYA_4444_8u,UYVY_422_8u"}),
+		{{"/nearest/name", "UYVY_422_8u"}, {"/cost", 2}, {"/source", "NTSCDV25"},
+			{"/why", "the cheapest conversion, from NTSCDV25 at a cost of 2"}});
+	ExpectFacts(
+		Document({"video", "nearest", "--from", "bgra,vuya", "--to", "vuya"}), {{"/why", "both sides know it"}});
+	ExpectFacts(
+		Document({"video", "nearest", "--from", "bgra", "--to", "any", "--request", "v210", "--prefer-request"}),
+		{{"/nearest/name", "V210_422_10u"}, {"/why", "it was requested, and the destination takes it"}});
+	ExpectFacts(Document({"video", "nearest", "--from", "NTSCDV25", "--to", "PALDV25"}),
+		{{"/why", "nothing converts; it is the first that frames can be worked in"}});
+	ExpectFacts(
+		Document({"video", "size", "V210_422_10u", "1280x720"}), {{"/frameBytes", 3456 * 720}, {"/rowBytes", 3456}});
+	ExpectFacts(Document({"video", "size", "PALDV25", "1x1"}),
+		{{"/frameBytes", 144'000}, {"/rowBytes", nullptr}, {"/fixedSize", {{"width", 720}, {"height", 576}}}});
+	ExpectFacts(Document({"video", "ratio", "10/11", "720x480"}),
+		{{"/inSquarePixels/width", 655}, {"/fromSquarePixels/width", 792}, {"/description", "D1/DV NTSC (0.9091)"},
+			{"/legacy", nullptr}});
+	ExpectFacts(Document({"video", "ratio", "9/10", "1x1"}), {{"/legacy", "10/11"}});
+	ExpectFacts(Document({"pulldown", "--cadence", "WSSWW"}),
+		{{"/rate", "30000/1001"}, {"/frames/1/videoFrame", 2}, {"/frames/1/letter", "S"}, {"/frames/1/marked", true},
+			{"/frames/5/videoTime", "00:00:00;07"}});
+	ExpectFacts(Document({"check"}), {{"/havePassed", true}, {"/checks/0/suite", "ZON.MediaTypes"}});
+	ExpectFacts(
+		Document({"keys"}), {{"/keys/0/path", "$$$/zonmediatypes/FrameRateFormat/Audio"}, {"/keys/0/text", "@0Hz"}});
 	ExpectFacts(Document({"samples", "48000", "--rate", "48000", "--format", "samples", "--fps", "25"}),
 		{{"/positions/0/sampleRate", 48'000}, {"/positions/0/formats/2/format", "timecode"},
 			{"/positions/0/formats/2/text", "00:00:01:00"}});
@@ -127,6 +169,14 @@ TEST(Zonmedia, ComplainsInOneLine)
 		{{"samples", "none", "--rate", "48000", "--format", "bars"}, 1, "\"none\": no digits"},
 		{{"samples", "1", "--rate", "48000", "--format", "dropframe", "--fps", "25"}, 2, "--fps 25"},
 		{{"samples", "1", "--rate", "48000", "--format", "bars", "--meter", "0/4"}, 2, "\"0/4\""},
+		{{"audio", "layout", "Steroe"}, 2, "no layout is named \"Steroe\"; the closest are Stereo"},
+		{{"audio", "layout", "L,Lz"}, 2, "no channel is named \"Lz\""},
+		{{"audio", "mtarix"}, 2, "no command is named \"mtarix\"; the closest are matrix"},
+		{{"video", "size", "BGRA4444_8", "1x1"}, 2, "the closest are BGRA_4444_8u"},
+		{{"video", "size", "bgra", "0x3"}, 2, "\"0x3\" is no frame size"},
+		{{"video", "cost", "bgra", "vuya", "--quality", "best"}, 2, "no quality is named \"best\""},
+		{{"video", "ratio", "4:3", "1x1"}, 2, "such as 10/11"},
+		{{"pulldown", "--cadence", "WWWWW"}, 2, "no cadence is named"},
 		{{"sheet", "missing.mov"}, 1, "missing.mov: No such file"},
 		{{"sheet", "/"}, 1, "/: Is a directory"},
 		{{"sheet", ZON_PROGRAM}, 1, "not a media file"},
@@ -184,7 +234,9 @@ TEST(Zonmedia, ShowsTheClip)
 			{"/end", {{"text", "01:00:03;00"}, {"ticks", 107'982 * 8'475'667'200}}},
 			{"/lastFrame", {{"text", "01:00:02;29"}, {"ticks", 107'981 * 8'475'667'200}}},
 			{"/duration", {{"text", "00:00:05;00"}, {"ticks", 150 * 8'475'667'200}}}, {"/frames", 150},
-			{"/audioStreams/0/rate", 48'000}, {"/audioStreams/0/layout", "Stereo"}});
+			{"/audioStreams/0/rate", 48'000}, {"/audioStreams/0/layout", "Stereo"},
+			{"/frameSize", {{"text", "720w 480h (0.9091)"}, {"width", 720}, {"height", 480}}},
+			{"/pixelShape/text", "D1/DV NTSC (0.9091)"}, {"/pixelFormat/text", "YUV 420 MPEG4 Frame 8u"}});
 	const Facts durations = {{"24", "00:00:05:00"}, {"59.94df", "00:00:05;00"}, {"frames", "150"}, {"16mm", "3+30"},
 		{"35mm", "9+06"}, {"samples", "00:00:05:00240"}, {"ms", "00:00:05.005"}, {"ticks", "1271350080000"}};
 	for (const auto& [display, text] : durations)
@@ -218,11 +270,30 @@ TEST(Zonmedia, ShowsWhatOtherSoftwareWrites)
 			{{"/rate", "2997/100"}, {"/rateIsRounded", true}, {"/frameDuration", 8'475'675'676}, {"/display", "frames"},
 				{"/end/text", "1000"}}},
 		{"fifteen.mp4", {{"/rate", "15"}, {"/display", "frames"}, {"/lastFrame/text", "14"}}},
-		{"mpeg2-pal.m2v", {{"/frames", 3}, {"/end/text", "00:00:00:03"}, {"/timecodeTag", nullptr}}},
-		{"dv25-ntsc.dv", {{"/frames", 1}, {"/frameDuration", 8'475'667'200}}},
-		{"dv100-720p60.mov", {{"/display", "59.94df"}}},
+		{"mpeg2-pal.m2v",
+			{{"/frames", 3}, {"/end/text", "00:00:00:03"}, {"/timecodeTag", nullptr}, {"/fields", "Lower Field First"},
+				{"/pixelFormat/text", "YUV 420 MPEG2 Field 8u"}}},
+		{"mpeg2-709.m2v", {{"/pixelFormat/text", "YUV 420 MPEG2 Field 8u 709"}, {"/frameSize/width", 1440}}},
+		{"uyvy.mov", {{"/pixelFormat/name", "UYVY_422_8u"}}},
+		{"yuyv.mov", {{"/pixelFormat/name", "YUYV_422_8u"}}},
+		{"bgra.avi", {{"/pixelFormat/name", "BGRA_4444_8u"}}},
+		{"argb.mov", {{"/pixelFormat/name", "ARGB_4444_8u"}}},
+		{"h264.mp4", {{"/pixelFormat", nullptr}, {"/storedAs", "yuv420p"}, {"/videoCodec", "h264"}}},
+		{"dv25-ntsc.dv", {{"/frames", 1}, {"/frameDuration", 8'475'667'200}, {"/pixelFormat/name", "NTSCDV25"}}},
+		{"dv25-pal.dv", {{"/pixelFormat/name", "PALDV25"}}},
+		{"dv50-ntsc.dv", {{"/pixelFormat/name", "NTSCDV50"}}},
+		{"dv50-pal.dv", {{"/pixelFormat/name", "PALDV50"}}},
+		{"dv100-720p60.mov", {{"/display", "59.94df"}, {"/pixelFormat/name", "NTSC_DV100_720p"}}},
+		{"dv100-1080i60.mov", {{"/pixelFormat/name", "NTSC_DV100_1080i"}}},
+		{"dv100-1080i50.mov", {{"/pixelFormat/name", "PAL_DV100_1080i"}}},
+		{"stereo.wav", {{"/audio", "Stereo"}}},
+		{"5.1-back.wav", {{"/audio", "5.1 (L, R, C, LFE, Ls, Rs)"}}},
+		{"5.1-side.wav", {{"/audio", "5.1 (L, R, C, LFE, Ls, Rs)"}}},
+		{"5.1.m4a", {{"/audio", "5.1 (L, R, C, LFE, Ls, Rs)"}, {"/samples", 2400}}},
+		{"7.1.wav", {{"/audio", "8 Channels (L R C LFE Rls Rrs Ls Rs)"}}},
 		{"mono.wav",
-			{{"/rate", "48000"}, {"/display", "samples"}, {"/samples", 480}, {"/milliseconds", "00:00:00.010"}}},
+			{{"/audio", "Mono"}, {"/rate", "48000"}, {"/display", "samples"}, {"/samples", 480},
+				{"/milliseconds", "00:00:00.010"}}},
 		{"ten-hours.wav", {{"/start/text", "10:00:00:00000"}, {"/lastSample/text", "10:00:00:00479"}}},
 		{"stereo.aac", {{"/samples", 49'152}}},
 	};

@@ -50,6 +50,7 @@ inline CLI::App& AddGroup(CLI::App& ioParent, const char* inName, const char* in
 void AddSheetCommand(CLI::App& ioApplication, Run& outRun);
 void AddTimeCommand(CLI::App& ioApplication, Run& outRun);
 void AddAudioCommands(CLI::App& ioApplication, Run& outRun);
+void AddVideoCommands(CLI::App& ioApplication, Run& outRun);
 void AddSamplesCommand(CLI::App& ioApplication, Run& outRun);
 void AddPulldownCommand(CLI::App& ioApplication, Run& outRun);
 void AddCheckCommand(CLI::App& ioApplication, Run& outRun);

@@ -63,6 +63,7 @@ Status RunCommandLine(std::vector<std::string> inArguments)
 	AddSamplesCommand(application, run);
 	AddPulldownCommand(application, run);
 	AddAudioCommands(application, run);
+	AddVideoCommands(application, run);
 	AddCheckCommand(application, run);
 	AddKeysCommand(application, run);
 	try

@@ -178,7 +178,17 @@ VideoStream ReadVideo(AVFormatContext& ioContext, AVStream& inStream)
 	video.mFrameCount = Length(ioContext, inStream, rate);
 	video.mWidth = parameters.width;
 	video.mHeight = parameters.height;
+	video.mPixelFormat = zonmediatypes::ToPixelFormat(parameters, rate);
+	video.mPixelShape = zonmediatypes::ToPixelAspectRatio(av_guess_sample_aspect_ratio(&ioContext, &inStream, nullptr));
+	video.mFieldType = zonmediatypes::ToFieldType(parameters.field_order);
 	return video;
+}
+
+// Two channels whose speakers the file does not state are stereo, as every format takes them; more could be anything.
+zonmediatypes::AudioChannelLayout LayoutOf(const AVChannelLayout& inLayout)
+{
+	const bool isStereo = inLayout.order == AV_CHANNEL_ORDER_UNSPEC && inLayout.nb_channels == 2;
+	return isStereo ? zonmediatypes::CreateStereoChannelLayout() : zonmediatypes::ToAudioChannelLayout(inLayout);
 }
 
 AudioStream ReadAudio(AVFormatContext& ioContext, const AVStream& inStream)
@@ -187,7 +197,7 @@ AudioStream ReadAudio(AVFormatContext& ioContext, const AVStream& inStream)
 	AudioStream audio;
 	audio.mCodec = avcodec_get_name(parameters.codec_id);
 	audio.mSampleRate = parameters.sample_rate;
-	audio.mLayout = zonmediatypes::ToAudioChannelLayout(parameters.ch_layout);
+	audio.mLayout = LayoutOf(parameters.ch_layout);
 	audio.mSampleCount = Length(ioContext, inStream, {parameters.sample_rate, 1});
 	return audio;
 }

@@ -5,6 +5,9 @@
 
 #include "zonmedia/Fraction.h"
 #include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PixelAspectRatio.h"
+#include "zonmediatypes/PixelFormat.h"
 
 #include <cstdint>
 #include <optional>
@@ -22,6 +25,9 @@ struct VideoStream
 	std::optional<std::int64_t> mFrameCount;
 	int mWidth = 0;
 	int mHeight = 0;
+	zonmediatypes::PixelFormat mPixelFormat;   ///< kPixelFormat_Invalid where the library has no counterpart
+	zonmediatypes::PixelAspectRatio mPixelShape = zonmediatypes::kPixelAspectRatio_Unknown;
+	zonmediatypes::FieldType mFieldType = zonmediatypes::kFieldType_Invalid;
 };
 
 struct AudioStream

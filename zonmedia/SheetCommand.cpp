@@ -3,6 +3,7 @@
 #include "zonmedia/MediaFile.h"
 #include "zonmedia/TimeNames.h"
 #include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/interop/TimeBase.h"
 
 #include <utility>
@@ -112,6 +113,37 @@ Span PictureSpan(const MediaFile& inFile, const VideoStream& inVideo, const Rate
 	return {"frame", "Frames", inRate, form, Start(inFile, inRate, form), inVideo.mFrameCount};
 }
 
+Value PixelShapeValue(PixelAspectRatio inShape)
+{
+	if (inShape == kPixelAspectRatio_Unknown)
+		return kUnknown;
+	const std::string text = UTF16to8(PixelAspectRatioDescription(inShape));
+	return {
+		text, Json{{"text", text}, {"numerator", inShape.GetNumerator()}, {"denominator", inShape.GetDenominator()}}};
+}
+
+Value PixelFormatValue(const VideoStream& inVideo)
+{
+	if (inVideo.mPixelFormat == kPixelFormat_Invalid)
+		return {"none: the library has no counterpart of " + inVideo.mCodec + " " + inVideo.mStoredFormat, nullptr};
+	const std::string name(PixelFormatCatalogueName(inVideo.mPixelFormat));
+	const std::string text = UTF16to8(PixelFormatDescription(inVideo.mPixelFormat));
+	return {text + " (" + name + ")", Json{{"text", text}, {"name", name}}};
+}
+
+void AddFrame(Record& ioRecord, const VideoStream& inVideo)
+{
+	const int width = inVideo.mWidth;
+	const int height = inVideo.mHeight;
+	const std::string size = UTF16to8(VideoFrameSizeDescription({0, 0, width, height}, inVideo.mPixelShape));
+	ioRecord.mItems.emplace_back(
+		Field{"Frame size", {size, Json{{"text", size}, {"width", width}, {"height", height}}}});
+	ioRecord.mItems.emplace_back(Field{"Pixel shape", PixelShapeValue(inVideo.mPixelShape)});
+	ioRecord.mItems.emplace_back(Field{"Fields", UTF16to8(FieldTypeDescription(inVideo.mFieldType))});
+	ioRecord.mItems.emplace_back(Field{"Stored as", inVideo.mStoredFormat});
+	ioRecord.mItems.emplace_back(Field{"Pixel format", PixelFormatValue(inVideo)});
+}
+
 void AddPicture(Record& ioRecord, const MediaFile& inFile, const VideoStream& inVideo)
 {
 	const std::optional<Rate> rate = MakeRate(inVideo.mRate);
@@ -120,6 +152,7 @@ void AddPicture(Record& ioRecord, const MediaFile& inFile, const VideoStream& in
 	else
 		ioRecord.mItems.emplace_back(Field{"Rate", kUnknown});
 	ioRecord.mItems.emplace_back(Field{"Video codec", inVideo.mCodec});
+	AddFrame(ioRecord, inVideo);
 }
 
 // ---- Sound -----------------------------------------------------------------------------------------------------------
@@ -140,6 +173,14 @@ void AddSound(Record& ioRecord, const MediaFile& inFile, const Rate& inRate)
 	if (const auto duration = span.Duration())
 		ioRecord.mItems.emplace_back(
 			Field{"Milliseconds", TimeText(*duration, inRate.mRate, {kTimeDisplay_Milliseconds})});
+}
+
+std::string AudioDescription(const MediaFile& inFile)
+{
+	AudioChannelLayouts layouts;
+	for (const AudioStream& stream : inFile.mAudio)
+		layouts.push_back(stream.mLayout);
+	return UTF16to8(AudioChannelConfigurationDescription(layouts));
 }
 
 Table AudioTable(const MediaFile& inFile)
@@ -168,6 +209,7 @@ Record MakeSheet(const std::string& inPath, const MediaFile& inFile)
 		AddPicture(sheet, inFile, *inFile.mVideo);
 	else if (sampleRate)
 		AddSound(sheet, inFile, *sampleRate);
+	sheet.mItems.emplace_back(Field{"Audio", AudioDescription(inFile)});
 	const std::optional<Rate> rate = inFile.mVideo ? MakeRate(inFile.mVideo->mRate) : std::nullopt;
 	if (rate)
 	{

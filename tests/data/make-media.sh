@@ -42,6 +42,9 @@ make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt yuyv422 -c:v rawvide
 make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt bgra -c:v rawvideo bgra.avi
 make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 -pix_fmt argb -c:v rawvideo argb.mov
 
+# A codec that the library has no pixel format for
+make -f lavfi -i "$(plain 64x48 25)" -frames:v 2 -pix_fmt yuv420p -c:v libx264 h264.mp4
+
 # Rates: one that is written with two decimals, and one without a display of its own
 make -f lavfi -i "$(plain 64x48 2997/100)" -frames:v 1000 -c:v mpeg4 -q:v 31 inexact.avi
 make -f lavfi -i "$(plain 64x48 15)" -frames:v 15 -c:v mpeg4 -q:v 31 fifteen.mp4
