@@ -38,6 +38,14 @@ run_readme_program()
 	[ "$said" = "$stated" ] || { echo "the README's program says '$said', and the README '$stated'" >&2; exit 1; }
 }
 
+# The sheet of the README is the beginning of what the companion says, which is installed beside the libraries.
+check_readme_sheet()
+{
+	sed -n '/^```text$/,/^```$/{/^```/!p}' "$source/README.md" >"$scratch/readme-sheet.txt"
+	(cd "$source" && "$scratch/installed-shared/bin/zonmedia" sheet examples/media/hour-change.mov) |
+		head -n "$(wc -l <"$scratch/readme-sheet.txt")" | diff "$scratch/readme-sheet.txt" -
+}
+
 # none WHAT COMMAND... fails when the command, run in the installation, prints anything.
 none()
 {
@@ -74,6 +82,9 @@ case $way in
 		;;
 	pkg-config-shared) compile_by_pkg_config shared pkg-config-shared "$here/Adopter.cpp" ;;
 	pkg-config-static) compile_by_pkg_config static pkg-config-static "$here/Adopter.cpp" --static ;;
-	readme) run_readme_program ;;
+	readme)
+		run_readme_program
+		[ ! -e "$scratch/installed-shared/bin/zonmedia" ] || check_readme_sheet
+		;;
 	*) echo "adopt.sh: no way is called '$way'" >&2; exit 2 ;;
 esac
