@@ -33,7 +33,11 @@ class UsageProblem : public std::runtime_error
 /// inText in quotation marks. Text of users and files is shown through Printable at the latest when it is written.
 inline std::string Quoted(std::string_view inText)
 {
-	return "\"" + std::string(inText) + "\"";
+	// Not by operator+: g++ 12 warns of an overlap that cannot be.
+	std::string text(1, '"');
+	text.append(inText);
+	text.push_back('"');
+	return text;
 }
 
 }   // namespace zonmedia
