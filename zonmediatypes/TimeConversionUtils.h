@@ -4,9 +4,9 @@
 /// Sample positions as text and back, for audio tools: timecode, frame counts, decimal time, milliseconds, and musical
 /// time in beats or in bars and beats.
 ///
-/// Positions are sample counts at a whole sample rate; frame rates are nominal whole rates. 29.97 frames per second is a
-/// nominal rate of 30 with an NTSC or drop-frame format, which scale it by 1000/1001. TickTime and FrameRate play no part
-/// here, and the texts differ from those of Timecode.h: drop-frame text has ";" between all its fields.
+/// Positions are sample counts at a whole sample rate; frame rates are nominal whole rates. 29.97 frames per second is
+/// a nominal rate of 30 with an NTSC or drop-frame format, which scale it by 1000/1001. TickTime and FrameRate play no
+/// part here, and the texts differ from those of Timecode.h: drop-frame text has ";" between all its fields.
 ///
 ///     UTF16String text;
 ///     ConvertSamplesToTimecode(text, 2'882'880, 48'000, kTimecodeFormat_TimecodeDropFrame, 30, nullptr, false);
@@ -17,8 +17,8 @@
 ///
 /// All functions are pure, take any argument without undefined behaviour (integers wrap, a floating-point value that
 /// does not fit its integer becomes the most negative one) and allocate nothing but the text that they return. They
-/// depend on no locale and may be called from any thread. Reading text costs time linear in its length and copies none of
-/// it.
+/// depend on no locale and may be called from any thread. Reading text costs time linear in its length and copies none
+/// of it.
 ///
 /// Misuse (no BeatInfo for a musical format, no beats per bar, drop-frame together with NTSC) is reported to the assert
 /// dialog of zoncore/Debug.h; the result is then false and the output is as before the call.
@@ -66,15 +66,15 @@ struct BeatInfo
 // Fields are runs of the digits "0" to "9"; every other character separates, the minus sign included: negative text
 // reads back as a positive position. A field above 2,147,483,647 counts as 0.
 
-/// Timecode text as a position, rounded up to the next sample. Fields are right-aligned into hours, minutes, seconds and
-/// frames, so that "3:04" is 3 s 4 frames and "10" is 10 frames; of five fields the first one is dropped. A field behind a
-/// "." is a fraction of a frame: "10.5" is ten frames and a half. Its divisor deliberately counts every character up to the
-/// end of the text: "10.5 " with a blank behind it is 10.05 frames, "12." is 0.012 frames, and ten or more such characters
-/// turn the value around.
+/// Timecode text as a position, rounded up to the next sample. Fields are right-aligned into hours, minutes, seconds
+/// and frames, so that "3:04" is 3 s 4 frames and "10" is 10 frames; of five fields the first one is dropped. A field
+/// behind a "." is a fraction of a frame: "10.5" is ten frames and a half. Its divisor deliberately counts every
+/// character up to the end of the text: "10.5 " with a blank behind it is 10.05 frames, "12." is 0.012 frames, and ten
+/// or more such characters turn the value around.
 ///
 /// inNTSC scales the rate by 1000/1001. inDropFrame reads drop-frame labels, where the dropped labels at the start of a
-/// minute stand for the first one that exists; it does not itself imply inNTSC. Empty text is -1, text without digits and
-/// a frame rate of 0 give 0. Always true.
+/// minute stand for the first one that exists; it does not itself imply inNTSC. Empty text is -1, text without digits
+/// and a frame rate of 0 give 0. Always true.
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inTimecode,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame) noexcept;
 
@@ -85,10 +85,10 @@ inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UT
 		outSamples, zoncore::UTF16StringView(inTimecode), inSampleRate, inFrameRate, inNTSC, inDropFrame);
 }
 
-/// Text of any format as a position. Empty text is -1, meaning no value; None and unknown formats are 0. Text in Decimal,
-/// Beats and Milliseconds is read as timecode one place to the left, so that "1:30" is 90 s (or beats, or milliseconds),
-/// "1:00:00" is an hour and "1:00:00:00" deliberately loses its hours; the result is rounded to the nearest sample.
-/// inBeatInfo is needed for Beats and BarsAndBeats only, inIsDuration matters for BarsAndBeats only.
+/// Text of any format as a position. Empty text is -1, meaning no value; None and unknown formats are 0. Text in
+/// Decimal, Beats and Milliseconds is read as timecode one place to the left, so that "1:30" is 90 s (or beats, or
+/// milliseconds), "1:00:00" is an hour and "1:00:00:00" deliberately loses its hours; the result is rounded to the
+/// nearest sample. inBeatInfo is needed for Beats and BarsAndBeats only, inIsDuration matters for BarsAndBeats only.
 /// False, and outSamples untouched, when a BeatInfo is needed and missing.
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inText,
 	TimecodeFormat inFormat, std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo,
@@ -102,9 +102,9 @@ inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UT
 		outSamples, zoncore::UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
 }
 
-/// Bars-and-beats text as a position, rounded to the nearest sample: bar, ":", beat, and optionally "." and ticks, as in
-/// "5:3.120"; text without ":" is a bar alone. With iTicksPerBeat -1 what follows "." is a decimal fraction of a beat.
-/// The first ":" and the first "." count, wherever they stand: in "2:2.5" the 5 is five ticks.
+/// Bars-and-beats text as a position, rounded to the nearest sample: bar, ":", beat, and optionally "." and ticks, as
+/// in "5:3.120"; text without ":" is a bar alone. With iTicksPerBeat -1 what follows "." is a decimal fraction of a
+/// beat. The first ":" and the first "." count, wherever they stand: in "2:2.5" the 5 is five ticks.
 ///
 /// As a position bars and beats count from 1 and the first bar begins at dOffsetMilliseconds; as a duration they count
 /// from 0. A tempo, beat value or tick count of 0 has no meaningful result.
@@ -121,9 +121,9 @@ inline std::int64_t ConvertBarsAndBeatsToSamples(
 //
 // The text replaces the one in outText; with enough capacity in it nothing is allocated.
 
-/// A position in any format. None and unknown formats leave outText as it is. inFrameRate matters for timecode and frame
-/// counts, inBeatInfo for Beats and BarsAndBeats, inIsDuration for BarsAndBeats only.
-/// False, and outText untouched, when a BeatInfo is needed and missing, or has no beats per bar.
+/// A position in any format. None and unknown formats leave outText as it is. inFrameRate matters for timecode and
+/// frame counts, inBeatInfo for Beats and BarsAndBeats, inIsDuration for BarsAndBeats only. False, and outText
+/// untouched, when a BeatInfo is needed and missing, or has no beats per bar.
 ///
 /// Milliseconds have one decimal and deliberately no more than six significant digits: 123,456.7 ms is "123457", and
 /// 1,234,567 ms "1.23457e+06".
@@ -143,39 +143,40 @@ ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, s
 /// - inShowSubframes: "." and hundredths of a frame behind the frames.
 /// - inTotalMinutes: no hours; minutes count on, "62:05:00".
 ///
-/// Frames have as many digits as the largest frame number of the rate, up to four. The text is "0" for a sample rate of 0 or below, and
-/// for a frame rate below 1 (drop-frame: below 30) or whose frames per minute or hour are 0 in 32 bits.
+/// Frames have as many digits as the largest frame number of the rate, up to four. The text is "0" for a sample rate of
+/// 0 or below, and for a frame rate below 1 (drop-frame: below 30) or whose frames per minute or hour are 0 in 32 bits.
 ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, std::int64_t inSamples,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inDropFrame, bool inNTSC, bool inFrameCountOnly,
 	bool inOmitFrames, bool inSuppressLeadingZeros, bool inShowSubframes, bool inTotalMinutes);
 
-/// A position as minutes and seconds with milliseconds, "   1:23.456", from one hour on with hours, "1:02:03.500", and from
-/// ten hours on with hundredths, "10:00:00.50". Below one hour the sign stands right-aligned in three columns of its own,
-/// blank for positive positions; deliberate. "0" for a sample rate of 0 or below. At sample rates of 500 and below
-/// position 0 shows a fraction: milliseconds are those of the middle of the sample.
+/// A position as minutes and seconds with milliseconds, "   1:23.456", from one hour on with hours, "1:02:03.500", and
+/// from ten hours on with hundredths, "10:00:00.50". Below one hour the sign stands right-aligned in three columns of
+/// its own, blank for positive positions; deliberate. "0" for a sample rate of 0 or below. At sample rates of 500 and
+/// below position 0 shows a fraction: milliseconds are those of the middle of the sample.
 ZONMEDIATYPES_API void ConvertSamplesToDecimalTimecode(
 	zoncore::UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction);
 
 /// A position as bars and beats. inStyle 0 is the bar alone, 1 "bar:beat", 2 "bar:beat.ticks", 3 and above have
-/// thousandths of a tick behind another "."; negative styles give an empty text. Ticks have as many digits as the largest
-/// one. Positions count from "1:1.000" at dOffsetMilliseconds, durations from "0:0.000"; before the first bar bars count
-/// down through 0 while beats stay 1 to iBeatsPerBar.
+/// thousandths of a tick behind another "."; negative styles give an empty text. Ticks have as many digits as the
+/// largest one. Positions count from "1:1.000" at dOffsetMilliseconds, durations from "0:0.000"; before the first bar
+/// bars count down through 0 while beats stay 1 to iBeatsPerBar.
 ///
-/// With iTicksPerBeat -1 the text is, for every style, the bar and right behind it the beat with decimals whose digits are
-/// all "0": deliberate, and no reader takes it. False, and outText untouched, when iBeatsPerBar is 0.
+/// With iTicksPerBeat -1 the text is, for every style, the bar and right behind it the beat with decimals whose digits
+/// are all "0": deliberate, and no reader takes it. False, and outText untouched, when iBeatsPerBar is 0.
 ZONMEDIATYPES_API bool ConvertSamplesToBarsAndBeats(zoncore::UTF16String& outText, double inSamples,
 	double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration, std::int32_t inStyle);
 
 /// A position in quarter notes with three decimals, "4.000", as 32-bit numbers. Before zero the decimals have a sign of
-/// their own: "-1.-499" is one beat and a half, rounded toward zero by half a thousandth; deliberate. "0" for a sample rate of 0.
+/// their own: "-1.-499" is one beat and a half, rounded toward zero by half a thousandth; deliberate. "0" for a sample
+/// rate of 0.
 ZONMEDIATYPES_API void ConvertSamplesToBeats(
 	zoncore::UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo);
 
 /// Splits the magnitude of a frame count into drop-frame labels at nominal rate inFrameRate. Hours do not wrap at 24.
 ///
 /// An output is written only in the step that computes it: hours from one hour on, minutes from ten minutes on (below,
-/// the minutes are added to the caller's), seconds from one second on, frames always. Pass zeros; deliberate. Returns the
-/// seconds field where it is computed, else 0. A frame rate below 30 leaves the outputs alone and returns 0.
+/// the minutes are added to the caller's), seconds from one second on, frames always. Pass zeros; deliberate. Returns
+/// the seconds field where it is computed, else 0. A frame rate below 30 leaves the outputs alone and returns 0.
 ZONMEDIATYPES_API std::int64_t DropFrameToHMSF(std::int64_t inFrame, std::int32_t inFrameRate, std::uint32_t& outHours,
 	std::uint32_t& outMinutes, std::uint32_t& outSeconds, std::uint32_t& outFrames) noexcept;
 

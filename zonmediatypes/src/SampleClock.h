@@ -41,8 +41,9 @@ inline double Fraction(double inValue) noexcept
 	return inValue - std::trunc(inValue);
 }
 
-/// Tells the host's assert dialog of misuse, unless the user has switched the calling place off, and stops in an attached
-/// debugger when the dialog asks for that. Hosts know these places by the file of the conversions' entry points.
+/// Tells the host's assert dialog of misuse, unless the user has switched the calling place off, and stops in an
+/// attached debugger when the dialog asks for that. Hosts know these places by the file of the conversions' entry
+/// points.
 inline void ReportMisuse(std::atomic<bool>& ioDisabled, const char* inCondition, const char* inMessage,
 	const char* inFunction, int inLine = __builtin_LINE())
 {

@@ -14,9 +14,9 @@
 #include <string>
 #include <string_view>
 
-// Each check looks at what a host relies on where its compiler, its libraries or its build options could have broken it:
-// exact durations, conversions that lose nothing, text that reads back. They take a few milliseconds and give the same
-// answer on every run.
+// Each check looks at what a host relies on where its compiler, its libraries or its build options could have broken
+// it: exact durations, conversions that lose nothing, text that reads back. They take a few milliseconds and give the
+// same answer on every run.
 
 namespace zonmediatypes
 {

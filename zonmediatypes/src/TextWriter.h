@@ -28,7 +28,8 @@ public:
 			Append(character);
 	}
 
-	/// inValue in decimal. It is padded with zeros to inWidth characters as a stream pads: in front of a minus sign, too.
+	/// inValue in decimal. It is padded with zeros to inWidth characters as a stream pads: in front of a minus sign,
+	/// too.
 	template <std::integral Integer>
 	void AppendNumber(Integer inValue, std::size_t inWidth = 1) noexcept
 	{

@@ -117,8 +117,8 @@ std::int32_t CountFrames(const TimecodeFields& inFields, std::int32_t inFrameRat
 	return WrappingAdd(WrappingMultiply(seconds, inFrameRate), inFields.mFrames);
 }
 
-// The frame that drop-frame labels stand for; labels that are dropped stand for the first one that is not. The quotients
-// are exact at 30 and 60 only and serve every rate as they are. 32-bit, wrapping.
+// The frame that drop-frame labels stand for; labels that are dropped stand for the first one that is not. The
+// quotients are exact at 30 and 60 only and serve every rate as they are. 32-bit, wrapping.
 std::int32_t CountDropFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
 {
 	const std::int32_t droppedPerMinute = inFrameRate / 15;
