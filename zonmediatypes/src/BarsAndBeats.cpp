@@ -106,54 +106,54 @@ MusicalPosition SplitBeats(double inBeats, const BeatInfo& inBeatInfo, std::int6
 }
 
 // The bar and, without a separator, the beat with decimals; every character behind the first "." becomes a "0".
-void AppendDecimalBeats(PositionText& ioText, const MusicalPosition& inPosition)
+void PutDecimalBeats(PositionText& ioText, const MusicalPosition& inPosition)
 {
 	const auto thousandths = TruncateTo<std::int64_t>(inPosition.mFraction * 1'000);
-	ioText.AppendNumber(inPosition.mBar);
-	ioText.AppendNumber(static_cast<double>(inPosition.mBeat) + static_cast<double>(thousandths) / 1'000.0);
+	ioText.PutNumber(inPosition.mBar);
+	ioText.PutNumber(static_cast<double>(inPosition.mBeat) + static_cast<double>(thousandths) / 1'000.0);
 	const auto chars = ioText.GetChars();
 	const auto point = std::ranges::find(chars, zoncore::UTF16Char{'.'});
 	if (point != chars.end())
 		std::fill(point + 1, chars.end(), zoncore::UTF16Char{'0'});
 }
 
-void AppendTicks(
+void PutTicks(
 	PositionText& ioText, const MusicalPosition& inPosition, std::int32_t inTicksPerBeat, std::int32_t inStyle)
 {
 	if (inStyle < 0)
 		return;
-	ioText.AppendNumber(inPosition.mBar);
+	ioText.PutNumber(inPosition.mBar);
 	if (inStyle < 1)
 		return;
-	ioText.Append(':');
-	ioText.AppendNumber(inPosition.mBeat);
+	ioText.Put(':');
+	ioText.PutNumber(inPosition.mBeat);
 	if (inStyle < 2)
 		return;
-	ioText.Append('.');
-	ioText.AppendNumber(inPosition.mTicks.mTicks, PaddedDigits(inTicksPerBeat));
+	ioText.Put('.');
+	ioText.PutNumber(inPosition.mTicks.mTicks, PaddedDigits(inTicksPerBeat));
 }
 
-void AppendBarsAndBeats(
+void PutBarsAndBeats(
 	PositionText& ioText, const MusicalPosition& inPosition, std::int32_t inTicksPerBeat, std::int32_t inStyle)
 {
 	if (inTicksPerBeat == kDecimalBeats)
-		AppendDecimalBeats(ioText, inPosition);
+		PutDecimalBeats(ioText, inPosition);
 	else
-		AppendTicks(ioText, inPosition, inTicksPerBeat, inStyle);
+		PutTicks(ioText, inPosition, inTicksPerBeat, inStyle);
 	if (inStyle < 3)
 		return;
-	ioText.Append('.');
-	ioText.AppendNumber(inPosition.mTicks.mMilliTicks, 3);
+	ioText.Put('.');
+	ioText.PutNumber(inPosition.mTicks.mMilliTicks, 3);
 }
 
-void AppendBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo)
+void PutBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo)
 {
 	if (inSampleRate == 0)
-		return ioText.Append('0');
+		return ioText.Put('0');
 	const double beats = static_cast<double>(inSamples) / (inSampleRate * 60.0 / inTempo) + 0.0005;
-	ioText.AppendNumber(TruncateTo<std::int32_t>(beats));
-	ioText.Append('.');
-	ioText.AppendNumber(TruncateTo<std::int32_t>(Fraction(beats) * 1'000), 3);
+	ioText.PutNumber(TruncateTo<std::int32_t>(beats));
+	ioText.Put('.');
+	ioText.PutNumber(TruncateTo<std::int32_t>(Fraction(beats) * 1'000), 3);
 }
 
 }   // namespace
@@ -190,13 +190,13 @@ bool ConvertSamplesToBarsAndBeats(UTF16String& outText, double inSamples, double
 	const double nudge = 0.5 / inBeatInfo.iTicksPerBeat / 1'000.0;   // half a thousandth of a tick, against truncation
 	const double beats = BeatsPerMinute(inBeatInfo) * samples / 60.0 / inSampleRate + nudge;
 	const MusicalPosition position = SplitBeats(beats, inBeatInfo, inIsDuration ? 0 : 1);
-	SetText(outText, AppendBarsAndBeats, position, inBeatInfo.iTicksPerBeat, inStyle);
+	SetText(outText, PutBarsAndBeats, position, inBeatInfo.iTicksPerBeat, inStyle);
 	return true;
 }
 
 void ConvertSamplesToBeats(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo)
 {
-	SetText(outText, AppendBeats, inSamples, inSampleRate, inTempo);
+	SetText(outText, PutBeats, inSamples, inSampleRate, inTempo);
 }
 
 }   // namespace zonmediatypes::utility

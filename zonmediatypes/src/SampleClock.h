@@ -12,7 +12,7 @@ namespace zonmediatypes::utility
 {
 
 /// Holds the longest text of a sample position: four numbers of 20 characters and their separators.
-using PositionText = TextWriter<96>;
+using PositionText = TextWriter<4 * (kLongestInteger + 1)>;
 
 /// Digits of the largest number below inCount, as far as positions are padded: 1 to 4.
 constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept
@@ -26,12 +26,12 @@ constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept
 	return 4;
 }
 
-/// Replaces outText by what inAppend writes of inArguments.
-template <class Append, class... Arguments>
-void SetText(zoncore::UTF16String& outText, Append inAppend, const Arguments&... inArguments)
+/// Replaces outText by what inPut writes of inArguments.
+template <class Put, class... Arguments>
+void SetText(zoncore::UTF16String& outText, Put inPut, const Arguments&... inArguments)
 {
 	PositionText text;
-	inAppend(text, inArguments...);
+	inPut(text, inArguments...);
 	outText.assign(text.GetText());
 }
 

@@ -14,58 +14,67 @@
 namespace zonmediatypes
 {
 
+inline constexpr std::size_t kLongestInteger = 20;   // characters of a 64-bit integer, its sign included
+
+inline constexpr auto kDigitPairs = []
+{
+	std::array<std::array<zoncore::UTF16Char, 2>, 100> pairs{};
+	for (std::size_t number = 0; number < pairs.size(); ++number)
+		pairs[number]
+			= {static_cast<zoncore::UTF16Char>('0' + number / 10), static_cast<zoncore::UTF16Char>('0' + number % 10)};
+	return pairs;
+}();
+
+/// Writes two digits of a number below 100; the end of what was written.
+inline zoncore::UTF16Char* WriteTwoDigits(std::size_t inNumber, zoncore::UTF16Char* outText) noexcept
+{
+	return std::copy_n(kDigitPairs[inNumber].data(), 2, outText);
+}
+
 /// A short text under construction: the characters that a 16-bit stream would write, without the stream and without
 /// memory of its own. Nothing checks the capacity; who uses it chooses one that the longest text fits into.
 template <std::size_t inCapacity>
 class TextWriter
 {
 public:
-	void Append(char inChar) noexcept { mChars[mLength++] = static_cast<unsigned char>(inChar); }
+	TextWriter() noexcept = default;
+	TextWriter(const TextWriter&) = delete;   // mEnd points into the object itself
+	TextWriter& operator=(const TextWriter&) = delete;
 
-	void Append(std::string_view inAscii) noexcept
-	{
-		for (const char character : inAscii)
-			Append(character);
-	}
+	void Put(char inChar) noexcept { *mEnd++ = static_cast<unsigned char>(inChar); }
+	void Put(std::string_view inAscii) noexcept { mEnd = std::ranges::copy(inAscii, mEnd).out; }
 
-	/// inValue in decimal. It is padded with zeros to inWidth characters as a stream pads: in front of a minus sign,
-	/// too.
+	/// inNumber is below 100.
+	void PutTwoDigits(std::size_t inNumber) noexcept { mEnd = WriteTwoDigits(inNumber, mEnd); }
+
+	/// inNumber in decimal, padded with zeros to inWidth characters as a stream pads: in front of a minus sign, too.
 	template <std::integral Integer>
-	void AppendNumber(Integer inValue, std::size_t inWidth = 1) noexcept
+	void PutNumber(Integer inNumber, std::size_t inWidth = 1) noexcept
 	{
-		if (inValue >= 0 && inValue < 100 && inWidth == 2)
-			return AppendTwoDigits(static_cast<unsigned>(inValue));
-		char digits[kLongestNumber];
-		const auto end = std::to_chars(digits, std::end(digits), inValue).ptr;
+		if (inNumber >= 0 && inNumber < 100 && inWidth == 2)
+			return PutTwoDigits(static_cast<std::size_t>(inNumber));
+		char digits[kLongestInteger];
+		const auto end = std::to_chars(digits, std::end(digits), inNumber).ptr;
 		const auto length = static_cast<std::size_t>(end - digits);
 		for (std::size_t i = length; i < inWidth; ++i)
-			Append('0');
-		Append(std::string_view(digits, length));
+			Put('0');
+		Put(std::string_view(digits, length));
 	}
 
-	/// inValue as a stream writes it by default: six significant digits, with an exponent where that is shorter.
-	void AppendNumber(double inValue) noexcept
+	/// inNumber as a stream writes it by default: six significant digits, with an exponent where that is shorter.
+	void PutNumber(double inNumber) noexcept
 	{
-		char digits[kLongestNumber];
-		const auto end = std::to_chars(digits, std::end(digits), inValue, std::chars_format::general, 6).ptr;
-		Append(std::string_view(digits, static_cast<std::size_t>(end - digits)));
+		char digits[kLongestInteger];   // 12 at most
+		const auto end = std::to_chars(digits, std::end(digits), inNumber, std::chars_format::general, 6).ptr;
+		Put(std::string_view(digits, static_cast<std::size_t>(end - digits)));
 	}
 
-	std::span<zoncore::UTF16Char> GetChars() noexcept { return {mChars.data(), mLength}; }
-	zoncore::UTF16StringView GetText() const noexcept { return {mChars.data(), mLength}; }
+	std::span<zoncore::UTF16Char> GetChars() noexcept { return {mChars.data(), mEnd}; }
+	zoncore::UTF16StringView GetText() const noexcept { return {mChars.data(), mEnd}; }
 
 private:
-	static constexpr std::size_t kLongestNumber = 24;   // 20 characters of a 64-bit integer, 13 of a double
-
-	void AppendTwoDigits(unsigned inValue) noexcept
-	{
-		mChars[mLength] = static_cast<zoncore::UTF16Char>('0' + inValue / 10);
-		mChars[mLength + 1] = static_cast<zoncore::UTF16Char>('0' + inValue % 10);
-		mLength += 2;
-	}
-
 	std::array<zoncore::UTF16Char, inCapacity> mChars;
-	std::size_t mLength = 0;
+	zoncore::UTF16Char* mEnd = mChars.data();
 };
 
 }   // namespace zonmediatypes

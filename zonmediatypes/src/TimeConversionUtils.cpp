@@ -227,7 +227,7 @@ std::int32_t CountDropFrames(std::int64_t inSamples, std::int32_t inSampleRate, 
 	return TruncateTo<std::int32_t>(frames);
 }
 
-void AppendDropFrame(PositionText& ioText, std::uint64_t inFrames, std::int32_t inFrameRate)
+void PutDropFrame(PositionText& ioText, std::uint64_t inFrames, std::int32_t inFrameRate)
 {
 	std::uint32_t hours = 0;
 	std::uint32_t minutes = 0;
@@ -236,23 +236,23 @@ void AppendDropFrame(PositionText& ioText, std::uint64_t inFrames, std::int32_t 
 	DropFrameToHMSF(static_cast<std::int64_t>(inFrames), inFrameRate, hours, minutes, seconds, frames);
 	for (const std::uint32_t label : {hours, minutes, seconds})
 	{
-		ioText.AppendNumber(label, 2);
-		ioText.Append(';');
+		ioText.PutNumber(label, 2);
+		ioText.Put(';');
 	}
-	ioText.AppendNumber(frames, 2);
+	ioText.PutNumber(frames, 2);
 }
 
 // A field and ":". While ioSuppresses is set a 0 is left out; the first field that is written clears it.
-void AppendField(PositionText& ioText, std::uint64_t inValue, bool& ioSuppresses, std::size_t inLeadingWidth = 1)
+void PutField(PositionText& ioText, std::uint64_t inValue, bool& ioSuppresses, std::size_t inLeadingWidth = 1)
 {
 	if (ioSuppresses && inValue == 0)
 		return;
-	ioText.AppendNumber(inValue, ioSuppresses ? inLeadingWidth : 2);
-	ioText.Append(':');
+	ioText.PutNumber(inValue, ioSuppresses ? inLeadingWidth : 2);
+	ioText.Put(':');
 	ioSuppresses = false;
 }
 
-void AppendNonDrop(
+void PutNonDrop(
 	PositionText& ioText, const FramePosition& inPosition, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
 {
 	const auto perSecond = static_cast<std::uint32_t>(inFrameRate);
@@ -265,91 +265,90 @@ void AppendNonDrop(
 
 	bool suppresses = inStyle.mSuppressLeadingZeros;
 	if (!inStyle.mTotalMinutes)
-		AppendField(ioText, hours, suppresses, 2);
-	AppendField(ioText, inStyle.mTotalMinutes ? minutes + hours * 60 : minutes, suppresses);
+		PutField(ioText, hours, suppresses, 2);
+	PutField(ioText, inStyle.mTotalMinutes ? minutes + hours * 60 : minutes, suppresses);
 	if (inStyle.mOmitFrames)
-		return ioText.AppendNumber(rest / perSecond, 2);
-	AppendField(ioText, rest / perSecond, suppresses);
-	ioText.AppendNumber(rest % perSecond, suppresses ? 1 : PaddedDigits(inFrameRate));
+		return ioText.PutNumber(rest / perSecond, 2);
+	PutField(ioText, rest / perSecond, suppresses);
+	ioText.PutNumber(rest % perSecond, suppresses ? 1 : PaddedDigits(inFrameRate));
 	if (!inStyle.mShowSubframes)
 		return;
-	ioText.Append('.');
-	ioText.AppendNumber(inPosition.GetHundredths() % 100, 2);
+	ioText.Put('.');
+	ioText.PutNumber(inPosition.GetHundredths() % 100, 2);
 }
 
-void AppendTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
+void PutTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
 	const TimecodeStyle& inStyle)
 {
 	if (!CanDivideBy(inSampleRate, inFrameRate, inStyle))
-		return ioText.Append('0');
+		return ioText.Put('0');
 	if (inStyle.mDropFrame && inStyle.mFrameCountOnly)
-		return ioText.AppendNumber(CountDropFrames(inSamples, inSampleRate, inFrameRate));
+		return ioText.PutNumber(CountDropFrames(inSamples, inSampleRate, inFrameRate));
 	const FramePosition position = SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle);
 	if (inStyle.mFrameCountOnly)
-		return ioText.AppendNumber(static_cast<std::int32_t>(position.GetFrames()));
+		return ioText.PutNumber(static_cast<std::int32_t>(position.GetFrames()));
 	if (inSamples < 0)
-		ioText.Append('-');
+		ioText.Put('-');
 	if (inStyle.mDropFrame)
-		AppendDropFrame(ioText, position.GetFrames(), inFrameRate);
+		PutDropFrame(ioText, position.GetFrames(), inFrameRate);
 	else
-		AppendNonDrop(ioText, position, inFrameRate, inStyle);
+		PutNonDrop(ioText, position, inFrameRate, inStyle);
 }
 
 bool WriteTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
 	const TimecodeStyle& inStyle)
 {
-	SetText(outText, AppendTimecode, inSamples, inSampleRate, inFrameRate, inStyle);
+	SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, inStyle);
 	return true;
 }
 
-void AppendDecimalFraction(
-	PositionText& ioText, std::uint64_t inSeconds, std::uint64_t inRest, std::int32_t inSampleRate)
+void PutDecimalFraction(PositionText& ioText, std::uint64_t inSeconds, std::uint64_t inRest, std::int32_t inSampleRate)
 {
 	constexpr std::uint64_t kTenHours = 36'000;
-	ioText.Append('.');
+	ioText.Put('.');
 	if (inSeconds >= kTenHours)
-		return ioText.AppendNumber(inRest * 100 / static_cast<std::uint32_t>(inSampleRate), 2);
+		return ioText.PutNumber(inRest * 100 / static_cast<std::uint32_t>(inSampleRate), 2);
 	const double milliseconds = (static_cast<double>(inRest) + 0.5) * 1'000.0 / inSampleRate;
-	ioText.AppendNumber(TruncateTo<std::int64_t>(milliseconds), 3);
+	ioText.PutNumber(TruncateTo<std::int64_t>(milliseconds), 3);
 }
 
-void AppendDecimal(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction)
+void PutDecimal(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction)
 {
 	if (inSampleRate <= 0)
-		return ioText.Append('0');
+		return ioText.Put('0');
 	const auto rate = static_cast<std::uint32_t>(inSampleRate);
 	const std::uint64_t samples = Magnitude(inSamples);
 	const std::uint64_t seconds = samples / rate;
 	const std::uint64_t minutes = seconds / 60;
 	if (seconds < 3'600)
 	{
-		ioText.Append(inSamples < 0 ? "  -" : "   ");
-		ioText.AppendNumber(minutes);
+		ioText.Put(inSamples < 0 ? "  -" : "   ");
+		ioText.PutNumber(minutes);
 	}
 	else
 	{
-		ioText.Append(inSamples < 0 ? "-" : "");
-		ioText.AppendNumber(seconds / 3'600);
-		ioText.Append(':');
-		ioText.AppendNumber(minutes % 60, 2);
+		ioText.Put(inSamples < 0 ? "-" : "");
+		ioText.PutNumber(seconds / 3'600);
+		ioText.Put(':');
+		ioText.PutNumber(minutes % 60, 2);
 	}
-	ioText.Append(':');
-	ioText.AppendNumber(seconds % 60, 2);
+	ioText.Put(':');
+	ioText.PutNumber(seconds % 60, 2);
 	if (!inOmitFraction)
-		AppendDecimalFraction(ioText, seconds, samples % rate, inSampleRate);
+		PutDecimalFraction(ioText, seconds, samples % rate, inSampleRate);
 }
 
-void AppendMilliseconds(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate)
+void PutMilliseconds(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate)
 {
 	if (inSampleRate == 0)
-		return ioText.Append('0');
+		return ioText.Put('0');
 	const double tenths = static_cast<double>(inSamples) * 10'000.0 / inSampleRate + 0.5;
-	ioText.AppendNumber((tenths - Fraction(tenths)) / 10.0);
+	ioText.PutNumber((tenths - Fraction(tenths)) / 10.0);
 }
 
-void AppendSampleCount(PositionText& ioText, std::int64_t inSamples)
+void PutSampleCount(PositionText& ioText, std::int64_t inSamples)
 {
-	ioText.AppendNumber(inSamples);
+	ioText.PutNumber(inSamples);
 }
 
 }   // namespace
@@ -439,10 +438,10 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 		ConvertSamplesToDecimalTimecode(outText, inSamples, inSampleRate, false);
 		return true;
 	case kTimecodeFormat_Samples:
-		SetText(outText, AppendSampleCount, inSamples);
+		SetText(outText, PutSampleCount, inSamples);
 		return true;
 	case kTimecodeFormat_Milliseconds:
-		SetText(outText, AppendMilliseconds, inSamples, inSampleRate);
+		SetText(outText, PutMilliseconds, inSamples, inSampleRate);
 		return true;
 	case kTimecodeFormat_Timecode:
 		return writeTimecode({});
@@ -500,7 +499,7 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 void ConvertSamplesToDecimalTimecode(
 	UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction)
 {
-	SetText(outText, AppendDecimal, inSamples, inSampleRate, inOmitFraction);
+	SetText(outText, PutDecimal, inSamples, inSampleRate, inOmitFraction);
 }
 
 std::int64_t DropFrameToHMSF(std::int64_t inFrame, std::int32_t inFrameRate, std::uint32_t& outHours,

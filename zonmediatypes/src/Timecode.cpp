@@ -3,10 +3,10 @@
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/src/DropFrame.h"
+#include "zonmediatypes/src/TextWriter.h"
 #include "zonmediatypes/src/TimeDisplayTable.h"
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
@@ -178,49 +178,8 @@ TickTime FieldsToTime(HMSF inFields, bool inNegative, FrameRate inRate, const Ti
 
 // ---- Time to text ----------------------------------------------------------------------------------------------------
 
-template <class Char>
-constexpr auto kDigitPairs = []
-{
-	std::array<std::array<Char, 2>, 100> pairs{};
-	for (std::size_t number = 0; number < pairs.size(); ++number)
-		pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
-	return pairs;
-}();
-
-// Writes two digits of a number below 100; the end of what was written.
-template <class Char>
-Char* WriteTwoDigits(std::uint64_t inNumber, Char* outText)
-{
-	return std::copy_n(kDigitPairs<Char>[inNumber].data(), 2, outText);
-}
-
-// A text under construction, in place: a sign, three fields with their separators and a 64-bit count fit.
-template <class Char>
-class TimecodeText
-{
-public:
-	const Char* Data() const { return mText.data(); }
-	std::size_t Size() const { return static_cast<std::size_t>(mEnd - mText.data()); }
-
-	void Put(char inChar) { *mEnd++ = static_cast<Char>(inChar); }
-	void PutTwoDigits(std::uint64_t inNumber) { mEnd = WriteTwoDigits(inNumber, mEnd); }
-
-	void PutNumber(std::uint64_t inNumber, int inMinDigits)
-	{
-		std::array<Char, kMostDigits> digits;
-		Char* first = digits.data() + digits.size();
-		for (std::uint64_t rest = inNumber; rest != 0 || inMinDigits > 0; rest /= 10, --inMinDigits)
-			*--first = static_cast<Char>('0' + rest % 10);
-		mEnd = std::copy(first, digits.data() + digits.size(), mEnd);
-	}
-
-private:
-	static constexpr std::size_t kMostDigits = std::numeric_limits<std::uint64_t>::digits10 + 1;
-	static constexpr std::size_t kMostChars = 1 + 3 * 3 + kMostDigits;
-
-	std::array<Char, kMostChars> mText;
-	Char* mEnd = mText.data();
-};
+// A sign, three fields with their separators and a 64-bit count.
+using TimecodeText = TextWriter<1 + 3 * 3 + kLongestInteger>;
 
 // The fields as they are shown: of a negative time without a sign the hours run backwards.
 HMSF ShownFields(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
@@ -251,15 +210,14 @@ bool HasUsualText(const TimeDisplayRow& inRow, TimecodeFlags inFlags)
 	return inRow.mKind == DisplayKind::Timecode && (inFlags & kOtherForms) == TimecodeFlags();
 }
 
-template <class Char>
-void WriteUsualText(HMSF inFields, char inFrameSeparator, Char* outText)
+void WriteUsualText(HMSF inFields, char inFrameSeparator, UTF16Char* outText)
 {
 	WriteTwoDigits(inFields.mHours, outText);
 	outText[2] = ':';
 	WriteTwoDigits(inFields.mMinutes, outText + 3);
 	outText[5] = ':';
 	WriteTwoDigits(inFields.mSeconds, outText + 6);
-	outText[8] = static_cast<Char>(inFrameSeparator);
+	outText[8] = static_cast<UTF16Char>(inFrameSeparator);
 	WriteTwoDigits(inFields.mFrames, outText + 9);
 }
 
@@ -267,7 +225,7 @@ void WriteUsualText(HMSF inFields, char inFrameSeparator, Char* outText)
 
 // How many digits the frames field has at least: those of the largest frame number, up to five and with some room for
 // rates that are just above a power of ten.
-int FrameDigits(const TimeDisplayRow& inRow, FrameRate inRate)
+std::size_t FrameDigits(const TimeDisplayRow& inRow, FrameRate inRate)
 {
 	const std::int64_t duration = inRate.GetTicksPerFrame();
 	if (inRow.mKind == DisplayKind::Timecode)
@@ -278,9 +236,8 @@ int FrameDigits(const TimeDisplayRow& inRow, FrameRate inRate)
 	return nominal <= 109 ? 2 : nominal <= 1'099 ? 3 : nominal <= 10'999 ? 4 : 5;
 }
 
-template <class Char>
 void PutFields(
-	TimecodeText<Char>& ioText, HMSF inFields, const TimeDisplayRow& inRow, int inFrameDigits, TimecodeFlags inFlags)
+	TimecodeText& ioText, HMSF inFields, const TimeDisplayRow& inRow, std::size_t inFrameDigits, TimecodeFlags inFlags)
 {
 	bool isLeading = inFlags.Test(kTimecodeFlag_TrimLeadingZeros);
 	const auto put = [&](std::uint32_t inField)
@@ -305,8 +262,7 @@ void PutFields(
 	ioText.PutNumber(inFields.mFrames, inFrameDigits);
 }
 
-template <class Char>
-void PutFeet(TimecodeText<Char>& ioText, TickTime inTime, FrameRate inRate, int inFramesPerFoot)
+void PutFeet(TimecodeText& ioText, TickTime inTime, FrameRate inRate, int inFramesPerFoot)
 {
 	const std::int64_t frames = inTime.ToFrame64(inRate);
 	if (inTime < kTime_Zero)
@@ -316,17 +272,14 @@ void PutFeet(TimecodeText<Char>& ioText, TickTime inTime, FrameRate inRate, int 
 	ioText.PutTwoDigits(Magnitude(frames % inFramesPerFoot));
 }
 
-template <class Char>
-void PutFrameCount(TimecodeText<Char>& ioText, std::int64_t inFrames)
+void PutFrameCount(TimecodeText& ioText, std::int64_t inFrames)
 {
 	if (inFrames < 0)
 		ioText.Put('-');
 	ioText.PutNumber(Magnitude(inFrames), 1);
 }
 
-template <class Char>
-void PutTimecode(
-	TimecodeText<Char>& ioText, TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
+void PutTimecode(TimecodeText& ioText, TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
 {
 	const TimeDisplayRow& row = FindTimeDisplay(inDisplay);
 	const bool showsSign = inFlags.Test(kTimecodeFlag_ShowSign);
@@ -338,7 +291,7 @@ void PutTimecode(
 		return PutFeet(ioText, inTime, inRate, row.mFramesPerFoot);
 	if (showsSign && inTime < kTime_Zero)
 		ioText.Put('-');
-	const int frameDigits = FrameDigits(row, row.CountsAtCallersRate() ? inRate : row.mRate);
+	const std::size_t frameDigits = FrameDigits(row, row.CountsAtCallersRate() ? inRate : row.mRate);
 	PutFields(ioText, ShownFields(inTime, inRate, inDisplay, inFlags), row, frameDigits, inFlags);
 }
 
@@ -524,9 +477,9 @@ UTF16String TimeToTimecode(TickTime inTime, FrameRate inRate, TimeDisplay inDisp
 		WriteUsualText(ShownFields(time, inRate, display, inFlags), FrameSeparator(row), text.data());
 		return text;
 	}
-	TimecodeText<UTF16Char> text;
+	TimecodeText text;
 	PutTimecode(text, time, inRate, display, inFlags);
-	return UTF16String(text.Data(), text.Size());
+	return UTF16String(text.GetText());
 }
 
 TickTime TimecodeToTime(UTF16StringView inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags) noexcept
