@@ -47,6 +47,8 @@ if(TARGET zonmedia)
 	file(RELATIVE_PATH librariesFromPrograms "/prefix/${CMAKE_INSTALL_BINDIR}" "/prefix/${CMAKE_INSTALL_LIBDIR}")
 	set_target_properties(zonmedia PROPERTIES INSTALL_RPATH "$ORIGIN/${librariesFromPrograms}")
 	install(TARGETS zonmedia RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}" COMPONENT companion)
+	install(FILES "${zonmediatypes_SOURCE_DIR}/zonmedia/completion.bash"
+		DESTINATION "${CMAKE_INSTALL_DATADIR}/bash-completion/completions" RENAME zonmedia COMPONENT companion)
 endif()
 
 if(PROJECT_IS_TOP_LEVEL)

@@ -46,6 +46,25 @@ check_readme_sheet()
 		head -n "$(wc -l <"$scratch/readme-sheet.txt")" | diff "$scratch/readme-sheet.txt" -
 }
 
+# Installed with the companion: a page for man, which has every command, and the completion of its words.
+check_companion()
+{
+	grep -q '^Usage: zonmedia audio matrix' "$scratch/installed-shared/share/man/man1/zonmedia.1"
+	# shellcheck disable=SC1091
+	source "$scratch/installed-shared/share/bash-completion/completions/zonmedia"
+	complete_words zonmedia audio ma
+	[[ " ${COMPREPLY[*]} " == *" matrix "* && " ${COMPREPLY[*]} " != *" layout "* ]]
+	complete_words zonmedia time --to
+	[[ " ${COMPREPLY[*]} " == *" --to-rate "* ]]
+}
+
+complete_words()
+{
+	COMP_WORDS=("$scratch/installed-shared/bin/$1" "${@:2}")
+	COMP_CWORD=$(($# - 1))
+	_zonmedia
+}
+
 # none WHAT COMMAND... fails when the command, run in the installation, prints anything.
 none()
 {
@@ -86,5 +105,6 @@ case $way in
 		run_readme_program
 		[ ! -e "$scratch/installed-shared/bin/zonmedia" ] || check_readme_sheet
 		;;
+	companion) check_companion ;;
 	*) echo "adopt.sh: no way is called '$way'" >&2; exit 2 ;;
 esac

@@ -1,0 +1,24 @@
+# Completion of zonmedia for bash. The program's own --help names the commands and options.
+
+_zonmedia()
+{
+	local program=${COMP_WORDS[0]} current=${COMP_WORDS[COMP_CWORD]} word
+	local -a command=()
+	for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
+		[[ $word =~ ^[a-z]+$ ]] || break
+		command+=("$word")
+		((${#command[@]} < 2)) || break
+	done
+
+	local help names
+	help=$("$program" "${command[@]}" --help 2>/dev/null) || return
+	if [[ $current == -* ]]; then
+		names=$(sed -n 's/^  \(-[^ ]*\).*/\1/p' <<<"$help" | tr ',' '\n')
+	else
+		names=$(sed -n '/^Subcommands:/,/^$/s/^  \([a-z][a-z-]*\) .*/\1/p' <<<"$help")
+	fi
+	mapfile -t COMPREPLY < <(compgen -W "$names" -- "$current")
+}
+
+# Without a name that fits, file names are offered.
+complete -o default -F _zonmedia zonmedia
