@@ -3,6 +3,7 @@
 #include "FuzzInput.h"
 #include "zonmedia/AudioNames.h"
 #include "zonmedia/TimeNames.h"
+#include "zonmedia/VideoNames.h"
 
 #include <string>
 
@@ -57,6 +58,29 @@ void CheckLayout(std::string_view inText)
 	Require(layout.empty() || ReadLayout(abbreviations) == layout, "a layout is the list of its abbreviations");
 }
 
+void CheckFormats(std::string_view inText)
+{
+	const PixelFormats formats = ReadPixelFormats(inText);
+	std::string names;
+	for (const PixelFormat format : formats)
+		names += (names.empty() ? "" : ",") + NameOf(format);
+	Require(formats.empty() || ReadPixelFormats(names) == formats, "formats are the list of their names");
+}
+
+void CheckSize(std::string_view inText)
+{
+	const zoncore::PointT<int> size = ReadSize(inText);
+	Require(size.x > 0 && size.y > 0, "a size is above 0");
+	Require(ReadSize(std::to_string(size.x) + "x" + std::to_string(size.y)) == size, "a size survives");
+}
+
+void CheckShape(std::string_view inText)
+{
+	const PixelAspectRatio ratio = ReadPixelAspectRatio(inText);
+	const std::string text = std::to_string(ratio.GetNumerator()) + "/" + std::to_string(ratio.GetDenominator());
+	Require(ReadPixelAspectRatio(text) == ratio, "a shape survives");
+}
+
 void CheckDistance(std::string_view inText)
 {
 	const std::string_view left = inText.substr(0, inText.size() / 2), right = inText.substr(inText.size() / 2);
@@ -71,7 +95,7 @@ void CheckDistance(std::string_view inText)
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
 	FuzzInput input(inData, inSize);
-	const std::size_t kind = input.Below(5);
+	const std::size_t kind = input.Below(9);
 	const TimeForm form = TimeForms()[input.Below(TimeForms().size())].mValue;
 	const FrameRate rate = input.OneOf(AllFrameRates());
 	const std::string_view text = input.Rest();
@@ -91,6 +115,18 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t in
 		break;
 	case 4:
 		CheckDistance(text);
+		break;
+	case 5:
+		MayRefuse<UsageProblem>([&] { CheckFormats(text); });
+		break;
+	case 6:
+		MayRefuse<UsageProblem>([&] { CheckSize(text); });
+		break;
+	case 7:
+		MayRefuse<UsageProblem>([&] { CheckShape(text); });
+		break;
+	case 8:
+		MayRefuse<UsageProblem>([&] { Require(ReadQuality(text) > 0, "a quality is known"); });
 		break;
 	}
 	return 0;

@@ -51,11 +51,13 @@ std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS)
 
 std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames)
 {
-	const auto distance = [inText](std::string_view inName) { return EditDistance(inName, inText); };
-	std::ranges::stable_sort(inNames, {}, distance);
+	std::vector<std::pair<std::size_t, std::string_view>> byDistance;
+	for (const std::string_view name : inNames)
+		byDistance.emplace_back(EditDistance(name, inText), name);
+	std::ranges::stable_sort(byDistance, {}, &std::pair<std::size_t, std::string_view>::first);
 	std::string sentence = "no " + std::string(inWhat) + " is named " + Quoted(inText) + "; the closest are";
-	for (std::size_t i = 0; i < std::min(kSuggestions, inNames.size()); ++i)
-		sentence.append(i == 0 ? " " : ", ").append(inNames[i]);
+	for (std::size_t i = 0; i < std::min(kSuggestions, byDistance.size()); ++i)
+		sentence.append(i == 0 ? " " : ", ").append(byDistance[i].second);
 	return sentence;
 }
 
