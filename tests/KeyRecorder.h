@@ -16,7 +16,7 @@ namespace zontest
 class KeyRecorder
 {
 public:
-	explicit KeyRecorder(std::string inTranslation = {})
+	explicit KeyRecorder(const std::string& inTranslation = {})
 	{
 		zoncore::config::Localizer::Get().SetTranslator(
 			[this, inTranslation](std::string_view inKey, zoncore::UTF16String& outText)

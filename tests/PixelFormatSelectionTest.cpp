@@ -56,8 +56,8 @@ int Cost(Bits inFrom, Bits inTo, int inQuality)
 	int cost = (inFrom & 0x3C000) == 0 ? 1 : 2;
 	if ((inTo & 0x3C000) != 0)
 		cost += 10000;
-	const int fromDepth = inFrom >> 1 & 7;
-	const int toDepth = inTo >> 1 & 7;
+	const int fromDepth = static_cast<int>(inFrom >> 1 & 7);
+	const int toDepth = static_cast<int>(inTo >> 1 & 7);
 	const bool toYUV = (inTo & 1) != 0;
 	if (differs(1))
 	{

@@ -16,6 +16,7 @@ namespace
 {
 
 // A static initialiser of a host sees the constants and the catalogue, and may register.
+// NOLINTNEXTLINE(cppcoreguidelines-interfaces-global-init): that it may is what is tested
 const PixelFormatProperties sSeenEarly = []
 {
 	RegisterCustomPixelFormatProperties(MakePixelFormatName('_', 'e', 'l', 'y'), kPixelFormat_UYVY_422_8u.mProperties);
@@ -91,7 +92,7 @@ TEST(PixelFormatProperties, FieldsStandWhereTheyStand)
 	for (int round = 0; round < 2'000; ++round)
 	{
 		const P value(static_cast<std::uint32_t>(random()));
-		const unsigned code = static_cast<unsigned>(random());
+		const auto code = static_cast<unsigned>(random());
 		for (const Field& field : fields)
 		{
 			const std::uint32_t low = (1u << field.mBits) - 1;
@@ -109,7 +110,7 @@ TEST(PixelFormatProperties, PredicatesAreMasksOnTheWholeValue)
 	std::mt19937 random(6);
 	for (int round = 0; round < 20'000; ++round)
 	{
-		const std::uint32_t value = static_cast<std::uint32_t>(random());
+		const auto value = static_cast<std::uint32_t>(random());
 		const PixelFormatProperties properties(value);
 		const unsigned compression = value >> 14 & 15;
 		EXPECT_EQ(properties.IsConcrete(), (value & 0xC0000) == 0x40000);
@@ -199,8 +200,8 @@ TEST(CustomPixelFormats, AMillionOfThem)
 TEST(CustomPixelFormats, ServeWritersAndReadersAtOnce)
 {
 	constexpr std::uint32_t kNames = 3'000;
-	const auto name
-		= [](std::uint32_t inWriter, std::uint32_t i) { return NumberedName(0x800000 | inWriter << 16 | i); };
+	const auto name = [](std::uint32_t inWriter, std::uint32_t inIndex)
+	{ return NumberedName(0x800000 | inWriter << 16 | inIndex); };
 	std::atomic<int> wrong = 0;
 	std::vector<std::thread> threads;
 	for (const std::uint32_t writer : {1u, 2u})

@@ -132,8 +132,10 @@ TEST(PixelFormatDescription, DecidesByWildcardNameKindAndCompression)
 		{format("_abc", 0xBC000), "Any Pixel Format", "PixelFormat/Any=Any Pixel Format"},
 		{format("_abc", 0x3C000), "Custom Pixel Format (cba_)", "PixelFormat/Custom=Custom Pixel Format (@0)"},
 		{format("@abc", 0x40080), "Custom Pixel Format (cba@)", "PixelFormat/Custom=Custom Pixel Format (@0)"},
-		{format("_\0bc", 0x40080), "Custom Pixel Format (cb)", "PixelFormat/Custom=Custom Pixel Format (@0)"},
-		{format("_ab\0", 0x40080), "Custom Pixel Format ()", "PixelFormat/Custom=Custom Pixel Format (@0)"},
+		{{MakePixelFormatName('_', '\0', 'b', 'c'), kPixelFormat_BGRA_4444_8u.mProperties}, "Custom Pixel Format (cb)",
+			"PixelFormat/Custom=Custom Pixel Format (@0)"},
+		{{MakePixelFormatName('_', 'a', 'b', '\0'), kPixelFormat_BGRA_4444_8u.mProperties}, "Custom Pixel Format ()",
+			"PixelFormat/Custom=Custom Pixel Format (@0)"},
 		{format("_a\xE9z", 0x40080),
 			"Custom Pixel Format (z\uFFFD"
 			"a_)",
