@@ -1,3 +1,4 @@
+#include "tests/Allocations.h"
 #include "tests/PixelFormatTable.h"
 
 #include <gtest/gtest.h>
@@ -177,6 +178,14 @@ TEST(CustomPixelFormats, AreFoundAfterRegistrationUnderTheirPrefixOnly)
 	}
 	RegisterCustomPixelFormatProperties(at, PixelFormatProperties(0x4FFFF));
 	EXPECT_EQ(GuessNameForProperties(PixelFormatProperties(0x4FFFF)), kPixelFormatFourCC_Invalid);
+}
+
+TEST(CustomPixelFormats, AreAsBeforeWhenMemoryRunsOut)
+{
+	const PixelFormatName name = MakePixelFormatName('_', 'm', 'e', 'm');
+	zontest::FailEachAllocation([=] { RegisterCustomPixelFormatProperties(name, kSomeProperties); },
+		[=] { EXPECT_EQ(LookupPropertiesForName(name), kPixelFormatProperties_Invalid); });
+	EXPECT_EQ(LookupPropertiesForName(name), kSomeProperties);
 }
 
 PixelFormatName NumberedName(std::uint32_t inNumber)
