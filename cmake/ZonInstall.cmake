@@ -1,5 +1,5 @@
-# What is installed, as three components that become the three Debian packages: runtime (the libraries), development
-# (headers and everything that finds the libraries) and companion (zonmedia).
+# What is installed, as three components that become the three Debian packages: runtime (the libraries and the message
+# catalogues), development (headers and everything that finds the libraries) and companion (zonmedia).
 #
 # A shared and a static build may be installed into the same prefix; the CMake package chooses, see its file.
 include(CMakePackageConfigHelpers)
@@ -24,7 +24,8 @@ install(FILES "${zonmediatypes_BINARY_DIR}/include/zonmediatypes/Version.h"
 	DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/zonmediatypes" COMPONENT development)
 
 configure_package_config_file("${CMAKE_CURRENT_LIST_DIR}/zonmediatypesConfig.cmake.in"
-	"${generated}/zonmediatypesConfig.cmake" INSTALL_DESTINATION "${package}" NO_SET_AND_CHECK_MACRO)
+	"${generated}/zonmediatypesConfig.cmake" INSTALL_DESTINATION "${package}"
+	PATH_VARS ZON_INSTALL_LOCALEDIR NO_SET_AND_CHECK_MACRO)
 write_basic_package_version_file("${generated}/zonmediatypesConfigVersion.cmake"
 	VERSION ${zonmediatypes_VERSION} COMPATIBILITY SameMajorVersion)
 install(FILES "${generated}/zonmediatypesConfig.cmake" "${generated}/zonmediatypesConfigVersion.cmake"
