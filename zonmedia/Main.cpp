@@ -1,6 +1,7 @@
 // The command-line companion of the library: shows what the library makes of media files, times, channels and formats.
 
 #include "zonmedia/Commands.h"
+#include "zonmedia/Language.h"
 #include "zonmedia/Names.h"
 #include "zonmediatypes/Version.h"
 
@@ -18,7 +19,8 @@ using namespace zonmedia;   // NOLINT(google-build-using-namespace): this is its
 
 constexpr const char* kFooter = R"(Exit status:
   0  everything asked for was done
-  1  a file or a value could not be read, or a check failed; everything else was still done
+  1  a file or a value could not be read, or a check failed; everything else was still done,
+     in English when it is the language that is missing or damaged
   2  the arguments make no command)";
 
 // A value such as "-:30" begins as an option does; behind "--" everything is a value.
@@ -51,12 +53,32 @@ std::string Explanation(const CLI::App& inApplication, const CLI::ParseError& in
 	return UnknownName("command", extras.front(), commands);
 }
 
+// Fine, or a complaint: the command runs all the same, in English.
+Status ChooseLanguage(const std::string& inLanguage)
+{
+	try
+	{
+		if (!inLanguage.empty())
+			UseLanguage(inLanguage);
+		return Status::Fine;
+	}
+	catch (const InputProblem& problem)
+	{
+		Complain("", problem.what());
+		return Status::BadInput;
+	}
+}
+
 Status RunCommandLine(std::vector<std::string> inArguments)
 {
 	Run run;
+	std::string language;
 	CLI::App application("Media times, timecode, audio channels and video formats", "zonmedia");
 	application.footer(kFooter);
 	application.set_version_flag("--version", zonmediatypes::Version());
+	application.add_option("--language", language,
+		"Describe values in a language, such as de or pt_BR, or from a message catalogue, such as ./de.mo");
+	application.fallthrough();   // --language may stand behind the command, too
 	application.require_subcommand(1);
 	AddSheetCommand(application, run);
 	AddTimeCommand(application, run);
@@ -80,7 +102,8 @@ Status RunCommandLine(std::vector<std::string> inArguments)
 	{
 		throw UsageProblem(Explanation(application, error));
 	}
-	return run();
+	const Status status = ChooseLanguage(language);
+	return std::max(status, run());
 }
 
 Status RunAndComplain(std::vector<std::string> inArguments)

@@ -106,5 +106,9 @@ case $way in
 		[ ! -e "$scratch/installed-shared/bin/zonmedia" ] || check_readme_sheet
 		;;
 	companion) check_companion ;;
+	translations)
+		text=$("$scratch/installed-shared/bin/zonmedia" --language de time 1 --rate 25 --display frames)
+		[[ $text == *24-fps-Timecode* ]] || { echo "the installed companion speaks no German" >&2; exit 1; }
+		;;
 	*) echo "adopt.sh: no way is called '$way'" >&2; exit 2 ;;
 esac

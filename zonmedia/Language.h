@@ -1,0 +1,16 @@
+#pragma once
+
+/// \file
+/// The language of the texts that the library gives. The companion's own words stay English.
+
+#include <string_view>
+
+namespace zonmedia
+{
+
+/// Has the library's texts looked up in a message catalogue: that of a language ("de", "pt_BR"; "de_AT.UTF-8" takes
+/// the nearest one there is), or the file that inLanguage names, which has a "/" in it or ends with ".mo". English needs
+/// none. Throws InputProblem, and leaves the language as it was, when the catalogue is missing or damaged.
+void UseLanguage(std::string_view inLanguage);
+
+}   // namespace zonmedia
