@@ -133,7 +133,7 @@ TEST(Beats, AreWritten)
 UTF16String OracleBarsAndBeats(
 	double inSamples, double inRate, const BeatInfo& inBeats, bool inIsDuration, std::int32_t inStyle)
 {
-	__extension__ typedef __int128 Wide;
+	__extension__ typedef __int128 Wide;   // NOLINT(modernize-use-using): the extension needs it
 	const auto wrap = [](Wide inValue) { return static_cast<std::int64_t>(static_cast<std::uint64_t>(inValue)); };
 	const std::int64_t perBar = inBeats.iBeatsPerBar;
 	const std::int64_t perBeat = inBeats.iTicksPerBeat;

@@ -157,7 +157,7 @@ TEST(FormattedText, IsRead)
 std::int64_t OracleRead(
 	const UTF16String& inText, std::int32_t inRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame)
 {
-	__extension__ typedef __int128 Wide;
+	__extension__ typedef __int128 Wide;   // NOLINT(modernize-use-using): the extension needs it
 	const auto narrow = [](Wide inValue) { return static_cast<std::int32_t>(static_cast<std::uint32_t>(inValue)); };
 	const auto isDigit = [&](std::size_t inIndex) { return inText[inIndex] >= '0' && inText[inIndex] <= '9'; };
 	std::vector<int> fields;
@@ -190,7 +190,9 @@ std::int64_t OracleRead(
 		fields.erase(fields.begin());
 	fields.insert(fields.begin(), 4 - fields.size(), 0);
 
-	const Wide h = fields[0], m = fields[1], s = fields[2];
+	const Wide h = fields[0];
+	const Wide m = fields[1];
+	const Wide s = fields[2];
 	Wide f = fields[3];
 	const Wide fps = inFrameRate;
 	Wide total = h * fps * 3'600 + m * fps * 60 + s * fps + f;
@@ -526,6 +528,22 @@ TEST(AnyPosition, IsWrittenAsAStreamWouldWriteIt)
 	}
 }
 
+struct Labels
+{
+	std::uint32_t mHours;
+	std::uint32_t mMinutes;
+	std::uint32_t mSeconds;
+	std::uint32_t mFrames;
+
+	bool operator==(const Labels&) const = default;
+};
+
+std::int64_t Split(std::int64_t inFrame, std::int32_t inFrameRate, Labels& ioLabels)
+{
+	return DropFrameToHMSF(
+		inFrame, inFrameRate, ioLabels.mHours, ioLabels.mMinutes, ioLabels.mSeconds, ioLabels.mFrames);
+}
+
 TEST(DropFrameToHMSF, GivesEveryLabelOfTwoHours)
 {
 	for (const std::uint32_t rate : {30u, 60u, 120u})
@@ -535,21 +553,17 @@ TEST(DropFrameToHMSF, GivesEveryLabelOfTwoHours)
 		{
 			if (label % (60 * rate) == 0 && label / (60 * rate) % 10 != 0)
 				label += rate / 15;
-			std::uint32_t h = 0, m = 0, s = 0, f = 0;
-			const std::int64_t result = DropFrameToHMSF(-frame, static_cast<std::int32_t>(rate), h, m, s, f);
-			ASSERT_EQ(((h * 60 + m) * 60 + s) * rate + f, label) << frame << " at " << rate;
-			ASSERT_TRUE(m < 60 && s < 60 && f < rate && result == s) << frame << " at " << rate;
+			Labels fields{};
+			const std::int64_t result = Split(-frame, static_cast<std::int32_t>(rate), fields);
+			const auto& [hours, minutes, seconds, frames] = fields;
+			ASSERT_EQ(((hours * 60 + minutes) * 60 + seconds) * rate + frames, label) << frame << " at " << rate;
+			ASSERT_TRUE(minutes < 60 && seconds < 60 && frames < rate && result == seconds) << frame << " at " << rate;
 		}
 	}
 }
 
 TEST(DropFrameToHMSF, WritesOnlyWhatItReaches)
 {
-	struct Labels
-	{
-		std::uint32_t h, m, s, f;
-		bool operator==(const Labels&) const = default;
-	};
 	struct Case
 	{
 		std::int64_t mFrame;
@@ -570,7 +584,7 @@ TEST(DropFrameToHMSF, WritesOnlyWhatItReaches)
 		 })
 	{
 		Labels written{7, 7, 7, 7};
-		EXPECT_EQ(DropFrameToHMSF(frame, rate, written.h, written.m, written.s, written.f), expected) << frame;
+		EXPECT_EQ(Split(frame, rate, written), expected) << frame;
 		EXPECT_EQ(written, labels) << frame;
 	}
 }

@@ -54,7 +54,7 @@ public:
 		if (inNumber >= 0 && inNumber < 100 && inWidth == 2)
 			return PutTwoDigits(static_cast<std::size_t>(inNumber));
 		char digits[kLongestInteger];
-		const auto end = std::to_chars(digits, std::end(digits), inNumber).ptr;
+		const char* const end = std::to_chars(digits, std::end(digits), inNumber).ptr;
 		const auto length = static_cast<std::size_t>(end - digits);
 		for (std::size_t i = length; i < inWidth; ++i)
 			Put('0');
@@ -65,7 +65,7 @@ public:
 	void PutNumber(double inNumber) noexcept
 	{
 		char digits[kLongestInteger];   // 12 at most
-		const auto end = std::to_chars(digits, std::end(digits), inNumber, std::chars_format::general, 6).ptr;
+		const char* const end = std::to_chars(digits, std::end(digits), inNumber, std::chars_format::general, 6).ptr;
 		Put(std::string_view(digits, static_cast<std::size_t>(end - digits)));
 	}
 
