@@ -3,6 +3,7 @@
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 
@@ -27,24 +28,26 @@ static_assert(sCarriers.size() == kVideoFrames);
 
 struct CadenceRow
 {
+	PulldownCadence mCadence;
 	std::size_t mPhase;
 	bool mIsMarked;
 };
 
 constexpr auto sCadences = std::to_array<CadenceRow>({
-	{0, true},    // None
-	{1, true},    // WSSWW
-	{2, true},    // SSWWW
-	{3, true},    // SWWWS
-	{4, true},    // WWWSS
-	{0, true},    // WWSSW
-	{4, false},   // Advanced_WWWSW
-	{0, false},   // Advanced_WWSWW
-	{1, false},   // Advanced_WSWWW
-	{2, false},   // Advanced_SWWWW
-	{3, false},   // Advanced_WWWWS
+	{kPulldownCadence_None, 0, true},
+	{kPulldownCadence_WSSWW, 1, true},
+	{kPulldownCadence_SSWWW, 2, true},
+	{kPulldownCadence_SWWWS, 3, true},
+	{kPulldownCadence_WWWSS, 4, true},
+	{kPulldownCadence_WWSSW, 0, true},
+	{kPulldownCadence_Advanced_WWWSW, 4, false},
+	{kPulldownCadence_Advanced_WWSWW, 0, false},
+	{kPulldownCadence_Advanced_WSWWW, 1, false},
+	{kPulldownCadence_Advanced_SWWWW, 2, false},
+	{kPulldownCadence_Advanced_WWWWS, 3, false},
 });
-static_assert(sCadences.size() == kPulldownCadence_Advanced_WWWWS + 1);
+static_assert(std::ranges::all_of(
+	sCadences, [](const CadenceRow& inRow) { return &inRow - sCadences.data() == inRow.mCadence; }));
 
 constexpr CadenceRow FindCadence(PulldownCadence inCadence)
 {

@@ -5,6 +5,7 @@
 #include "zonmediatypes/src/DropFrame.h"
 #include "zonmediatypes/src/SampleClock.h"
 
+#include <algorithm>
 #include <array>
 #include <limits>
 
@@ -31,6 +32,65 @@ constexpr std::int64_t kNoPosition = -1;   // what empty text is
 
 // Drop-frame numbering is that of 30 frames per second and of its whole multiples.
 constexpr std::int32_t kLowestDropFrameRate = 30;
+
+// How a position is written as timecode; see the flags of the public function.
+struct TimecodeStyle
+{
+	bool mDropFrame = false;
+	bool mNTSC = false;
+	bool mFrameCountOnly = false;
+	bool mOmitFrames = false;
+	bool mSuppressLeadingZeros = false;
+	bool mShowSubframes = false;
+	bool mTotalMinutes = false;
+};
+
+// What a text is made of.
+enum class TextKind : std::uint8_t
+{
+	Decimal,
+	Samples,
+	Timecode,
+	Beats,
+	BarsAndBeats,
+	Milliseconds,
+	None
+};
+
+struct FormatRow
+{
+	TimecodeFormat mFormat;
+	TextKind mKind;
+	TimecodeStyle mStyle = {};   // how timecode is written; drop-frame text is read at the scaled rate, too
+};
+
+// clang-format off
+constexpr auto sFormats = std::to_array<FormatRow>({
+	{kTimecodeFormat_Decimal,              TextKind::Decimal},
+	{kTimecodeFormat_Samples,              TextKind::Samples},
+	{kTimecodeFormat_Timecode,             TextKind::Timecode},
+	{kTimecodeFormat_TimecodeNTSC,         TextKind::Timecode, {.mNTSC = true}},
+	{kTimecodeFormat_TimecodeDropFrame,    TextKind::Timecode, {.mDropFrame = true}},
+	{kTimecodeFormat_Beats,                TextKind::Beats},
+	{kTimecodeFormat_BarsAndBeats,         TextKind::BarsAndBeats},
+	{kTimecodeFormat_None,                 TextKind::None},
+	{kTimecodeFormat_Frames,               TextKind::Timecode, {.mFrameCountOnly = true}},
+	{kTimecodeFormat_FramesDropFrame,      TextKind::Timecode, {.mDropFrame = true, .mFrameCountOnly = true}},
+	{kTimecodeFormat_TimecodeSubframes,    TextKind::Timecode, {.mSuppressLeadingZeros = true, .mShowSubframes = true}},
+	{kTimecodeFormat_Milliseconds,         TextKind::Milliseconds},
+	{kTimecodeFormat_TimecodeNTSCAlt,      TextKind::Timecode, {.mNTSC = true}},
+	{kTimecodeFormat_TimecodeDropFrameAlt, TextKind::Timecode, {.mDropFrame = true}},
+	{kTimecodeFormat_TimecodeNTSCAlt2,     TextKind::Timecode, {.mNTSC = true}},
+});
+// clang-format on
+static_assert(
+	std::ranges::all_of(sFormats, [](const FormatRow& inRow) { return &inRow - sFormats.data() == inRow.mFormat; }));
+
+// The row of a format; that of None for a number that is no format.
+constexpr const FormatRow& FindFormat(TimecodeFormat inFormat)
+{
+	return sFormats[inFormat < sFormats.size() ? inFormat : kTimecodeFormat_None];
+}
 
 bool ReportMissingBeatInfo(std::atomic<bool>& ioDisabled, const char* inFunction, int inLine = __builtin_LINE())
 {
@@ -178,18 +238,6 @@ std::int64_t ReadSampleCount(UTF16StringView inText)
 
 // ---- Samples to text -------------------------------------------------------------------------------------------------
 
-// How a position is written as timecode; see the flags of the public function.
-struct TimecodeStyle
-{
-	bool mDropFrame = false;
-	bool mNTSC = false;
-	bool mFrameCountOnly = false;
-	bool mOmitFrames = false;
-	bool mSuppressLeadingZeros = false;
-	bool mShowSubframes = false;
-	bool mTotalMinutes = false;
-};
-
 // The magnitude of a position in frames, mNumerator / mDenominator.
 struct FramePosition
 {
@@ -295,13 +343,6 @@ void PutTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSa
 		PutNonDrop(ioText, position, inFrameRate, inStyle);
 }
 
-bool WriteTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
-	const TimecodeStyle& inStyle)
-{
-	SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, inStyle);
-	return true;
-}
-
 void PutDecimalFraction(PositionText& ioText, std::uint64_t inSeconds, std::uint64_t inRest, std::int32_t inSampleRate)
 {
 	constexpr std::uint64_t kTenHours = 36'000;
@@ -378,30 +419,22 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 		outSamples = kNoPosition;
 		return true;
 	}
-	switch (inFormat)
+	const FormatRow& format = FindFormat(inFormat);
+	switch (format.mKind)
 	{
-	case kTimecodeFormat_Decimal:
+	case TextKind::Decimal:
 		outSamples = TruncateTo<std::int64_t>(inSampleRate * ReadDecimal(inText) + 0.5);
 		return true;
-	case kTimecodeFormat_Milliseconds:
+	case TextKind::Milliseconds:
 		outSamples = TruncateTo<std::int64_t>(inSampleRate * ReadDecimal(inText) / 1'000.0 + 0.5);
 		return true;
-	case kTimecodeFormat_Samples:
+	case TextKind::Samples:
 		outSamples = ReadSampleCount(inText);
 		return true;
-	case kTimecodeFormat_Timecode:
-	case kTimecodeFormat_Frames:
-	case kTimecodeFormat_TimecodeSubframes:
-		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, false, false);
-	case kTimecodeFormat_TimecodeNTSC:
-	case kTimecodeFormat_TimecodeNTSCAlt:
-	case kTimecodeFormat_TimecodeNTSCAlt2:
-		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, true, false);
-	case kTimecodeFormat_TimecodeDropFrame:
-	case kTimecodeFormat_TimecodeDropFrameAlt:
-	case kTimecodeFormat_FramesDropFrame:
-		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate, true, true);
-	case kTimecodeFormat_Beats:
+	case TextKind::Timecode:
+		return ConvertTimecodeToSamples(outSamples, inText, inSampleRate, inFrameRate,
+			format.mStyle.mNTSC || format.mStyle.mDropFrame, format.mStyle.mDropFrame);
+	case TextKind::Beats:
 		if (!inBeatInfo)
 		{
 			static constinit std::atomic<bool> sDisabled = false;
@@ -409,7 +442,7 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 		}
 		outSamples = TruncateTo<std::int64_t>(ReadDecimal(inText) * (inSampleRate * 60.0 / inBeatInfo->dTempo) + 0.5);
 		return true;
-	case kTimecodeFormat_BarsAndBeats:
+	case TextKind::BarsAndBeats:
 		if (!inBeatInfo)
 		{
 			static constinit std::atomic<bool> sDisabled = false;
@@ -417,7 +450,7 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 		}
 		outSamples = ConvertBarsAndBeatsToSamples(inText, inSampleRate, *inBeatInfo, inIsDuration);
 		return true;
-	case kTimecodeFormat_None:
+	case TextKind::None:
 		break;
 	}
 	outSamples = 0;   // deliberate for unknown formats, too
@@ -430,43 +463,30 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 	constexpr const char* kSignature
 		= "bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
 		  "TimecodeFormat, std::int32_t, const BeatInfo *, bool)";
-	const auto writeTimecode = [&](const TimecodeStyle& inStyle)
-	{ return WriteTimecode(outText, inSamples, inSampleRate, inFrameRate, inStyle); };
-	switch (inFormat)
+	const FormatRow& format = FindFormat(inFormat);
+	switch (format.mKind)
 	{
-	case kTimecodeFormat_Decimal:
-		ConvertSamplesToDecimalTimecode(outText, inSamples, inSampleRate, false);
-		return true;
-	case kTimecodeFormat_Samples:
-		SetText(outText, PutSampleCount, inSamples);
-		return true;
-	case kTimecodeFormat_Milliseconds:
+	case TextKind::Decimal:
+		SetText(outText, PutDecimal, inSamples, inSampleRate, false);
+		break;
+	case TextKind::Milliseconds:
 		SetText(outText, PutMilliseconds, inSamples, inSampleRate);
-		return true;
-	case kTimecodeFormat_Timecode:
-		return writeTimecode({});
-	case kTimecodeFormat_TimecodeNTSC:
-	case kTimecodeFormat_TimecodeNTSCAlt:
-	case kTimecodeFormat_TimecodeNTSCAlt2:
-		return writeTimecode({.mNTSC = true});
-	case kTimecodeFormat_TimecodeDropFrame:
-	case kTimecodeFormat_TimecodeDropFrameAlt:
-		return writeTimecode({.mDropFrame = true});
-	case kTimecodeFormat_Frames:
-		return writeTimecode({.mFrameCountOnly = true});
-	case kTimecodeFormat_FramesDropFrame:
-		return writeTimecode({.mDropFrame = true, .mFrameCountOnly = true});
-	case kTimecodeFormat_TimecodeSubframes:
-		return writeTimecode({.mSuppressLeadingZeros = true, .mShowSubframes = true});
-	case kTimecodeFormat_Beats:
+		break;
+	case TextKind::Samples:
+		SetText(outText, PutSampleCount, inSamples);
+		break;
+	case TextKind::Timecode:
+		SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, format.mStyle);
+		break;
+	case TextKind::Beats:
 		if (!inBeatInfo)
 		{
 			static constinit std::atomic<bool> sDisabled = false;
 			return ReportMissingBeatInfo(sDisabled, kSignature);
 		}
 		ConvertSamplesToBeats(outText, inSamples, inSampleRate, inBeatInfo->dTempo);
-		return true;
-	case kTimecodeFormat_BarsAndBeats:
+		break;
+	case TextKind::BarsAndBeats:
 		if (!inBeatInfo)
 		{
 			static constinit std::atomic<bool> sDisabled = false;
@@ -474,7 +494,7 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 		}
 		return ConvertSamplesToBarsAndBeats(
 			outText, static_cast<double>(inSamples), inSampleRate, *inBeatInfo, inIsDuration, 2);
-	case kTimecodeFormat_None:
+	case TextKind::None:
 		break;
 	}
 	return true;
@@ -492,8 +512,10 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 			"std::int32_t, bool, bool, bool, bool, bool, bool, bool)");
 		return false;
 	}
-	return WriteTimecode(outText, inSamples, inSampleRate, inFrameRate,
-		{inDropFrame, inNTSC, inFrameCountOnly, inOmitFrames, inSuppressLeadingZeros, inShowSubframes, inTotalMinutes});
+	const TimecodeStyle style{
+		inDropFrame, inNTSC, inFrameCountOnly, inOmitFrames, inSuppressLeadingZeros, inShowSubframes, inTotalMinutes};
+	SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, style);
+	return true;
 }
 
 void ConvertSamplesToDecimalTimecode(
