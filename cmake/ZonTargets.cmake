@@ -11,6 +11,12 @@ set(ZON_CODE_OPTIONS -ffp-contract=off -fno-semantic-interposition)
 # zonmediatypes::Initialize() as linkers know it.
 set(ZON_ENTRY_POINT _ZN13zonmediatypes10InitializeEv)
 
+# The big headers of others are compiled once; ccache, where it is used, does better without.
+set(ZON_PRECOMPILE ON)
+if(CMAKE_CXX_COMPILER_LAUNCHER MATCHES ccache)
+	set(ZON_PRECOMPILE OFF)
+endif()
+
 # Options that every target of the project shares, libraries and programs alike.
 function(zon_target_defaults inTarget)
 	target_compile_features(${inTarget} PUBLIC cxx_std_20)
