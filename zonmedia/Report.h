@@ -9,6 +9,7 @@
 #include <nlohmann/json.hpp>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <variant>
 #include <vector>
 
@@ -70,6 +71,8 @@ struct Record
 	/// What the sheet is about: its headline, and its first field in JSON. No headline when its text is empty.
 	Field mSubject;
 	std::vector<std::variant<Field, Table, Grid, Note>> mItems;
+
+	void Add(std::string inName, Value inValue) { mItems.emplace_back(Field{std::move(inName), std::move(inValue)}); }
 };
 
 /// How a run writes.
