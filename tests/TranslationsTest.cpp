@@ -119,7 +119,7 @@ TEST_P(Translation, HasOneAcceleratorInMenuItemsOfTheSameNames)
 	{
 		const std::string text(mCatalogue->Find(key));
 		const std::size_t mnemonic = key.find(kMnemonic);
-		const bool isItem = mnemonic != key.npos;
+		const bool isItem = mnemonic != std::string_view::npos;
 		EXPECT_EQ(std::ranges::count(text, '&'), isItem ? 1 : 0) << key << ": " << text;
 		if (!isItem)
 			continue;

@@ -58,7 +58,7 @@ std::string_view NoteFor(std::string_view inPath)
 {
 	const std::string_view path = inPath.substr(inPath.starts_with(kRoot) ? kRoot.size() : 0);
 	const auto fits = [path](const Note& inNote) { return path.starts_with(inNote.mPath); };
-	const auto note = std::ranges::find_if(sNotes, fits);
+	const auto* const note = std::ranges::find_if(sNotes, fits);
 	return note == sNotes.end() ? std::string_view() : note->mText;
 }
 

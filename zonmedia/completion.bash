@@ -3,8 +3,9 @@
 _zonmedia()
 {
 	local program=${COMP_WORDS[0]} current=${COMP_WORDS[COMP_CWORD]} word
-	local -a command=()
-	for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
+	local -a command=() words=("${COMP_WORDS[@]:1:COMP_CWORD-1}")
+	[[ ${words[0]-} != --language ]] || words=("${words[@]:2}")
+	for word in "${words[@]}"; do
 		[[ $word =~ ^[a-z]+$ ]] || break
 		command+=("$word")
 		((${#command[@]} < 2)) || break

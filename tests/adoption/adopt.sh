@@ -54,6 +54,8 @@ check_companion()
 	source "$scratch/installed-shared/share/bash-completion/completions/zonmedia"
 	complete_words zonmedia audio ma
 	[[ " ${COMPREPLY[*]} " == *" matrix "* && " ${COMPREPLY[*]} " != *" layout "* ]]
+	complete_words zonmedia --language de audio ma
+	[[ " ${COMPREPLY[*]} " == *" matrix "* ]]
 	complete_words zonmedia time --to
 	[[ " ${COMPREPLY[*]} " == *" --to-rate "* ]]
 }
