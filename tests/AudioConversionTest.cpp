@@ -4,10 +4,13 @@
 
 #include <gtest/gtest.h>
 
+#include <cfenv>
 #include <cmath>
 #include <limits>
+#include <map>
 #include <random>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace zonmediatypes
@@ -211,6 +214,14 @@ TEST(ConversionMatrix, OfKnownLayouts)
 	for (const MatrixCase& test : cases)
 		EXPECT_EQ(Convert(ReadLayout(test.mSource), ReadLayout(test.mDestination)), test.mMatrix)
 			<< test.mSource << " to " << test.mDestination;
+}
+
+// A host may let floating-point exceptions stop it.
+TEST(ConversionMatrix, OfNoChannelsDividesNothing)
+{
+	std::feclearexcept(FE_ALL_EXCEPT);
+	EXPECT_EQ(Convert(ReadLayout(""), ReadLayout("*")), (ChannelConversionMatrix{{}}));
+	EXPECT_EQ(std::fetestexcept(FE_DIVBYZERO), 0);
 }
 
 TEST(ConversionMatrix, OfManyChannels)

@@ -1,6 +1,7 @@
 #include "zonmediatypes/Descriptions.h"
 
 #include "tests/AudioTables.h"
+#include "tests/KeyRecorder.h"
 #include "zoncore/Localizer.h"
 #include "zoncore/StringUtils.h"
 
@@ -56,15 +57,9 @@ public:
 template <class Describe>
 Keys KeysOfCall(Describe inDescribe)
 {
-	Keys keys;
-	const Translation translation(
-		[&](std::string_view inKey, UTF16String&)
-		{
-			keys.emplace_back(inKey);
-			return false;
-		});
+	zontest::KeyRecorder recorder;
 	inDescribe();
-	return keys;
+	return recorder.TakeKeys();
 }
 
 AudioChannelLayouts ReadStreams(const std::string& inText)

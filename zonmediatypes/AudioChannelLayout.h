@@ -168,13 +168,18 @@ ZONMEDIATYPES_API void CreateIdentityChannelConversionMatrix(
 ///
 /// Without labels to go by, when either layout is empty or all `Discrete` and neither has exactly one channel, the matrix
 /// is the identity. Otherwise each destination channel takes, at the first of these rules that fits:
-///  - the first source channel of the same label;
+///  - having a label, the first source channel of the same label;
 ///  - a source's only channel, when that is `Discrete`: it feeds every channel at full gain, LFE included;
 ///  - being the k-th `Discrete` one, the k-th `Discrete` source channel;
 ///  - having a speaker position, all source channels whose speakers are nearest to it, in equal shares (1, 1/2, 1/3, ...).
 ///    LFE, LFE2 and `Discrete` have no position, on either side;
 ///  - being the only destination channel and `Discrete`, all source channels in equal shares, LFE included;
 ///  - nothing: the channel is silent.
+///
+/// Speakers stand on a grid of -2 ... 2 from left to right, from below to above ear level and from behind to in front: L at
+/// (-2, 0, 2), Lc (-1, 0, 2), Lsd (-2, 0, 0), Pl (-1, 0, 0), Ls (-2, 0, -2); Vhl, Tsl and Tbl 2 above L, Lsd and Ls, and Bfl 2
+/// below L. The right mirrors the left, centres stand between them. Lw shares the place of L, Rls that of Ls, Lt that of Lsd;
+/// X, Y and Z have those of Lsd, Ts and C. W and numbers that name no label are at (0, 0, 0). Distances are Euclidean.
 ///
 /// The matrix routes, it does not fold down: 5.1 to stereo drops centre, LFE and surrounds. Nothing reports source channels
 /// that no destination takes. Two unlabelled channels into one labelled one, or the reverse, are silent.

@@ -49,9 +49,10 @@ public:
 	/// The same with the channels of inLayout.
 	static AudioFormat CreateAudioFormat(const AudioChannelLayout& inLayout, std::uint32_t inSampleRate);
 
+	/// Whether rate, type and the labels in order are the same.
 	bool operator==(const AudioFormat& inOther) const noexcept;
 
-	/// Samples per second.
+	/// Samples per second; any number is stored as it is.
 	std::int32_t GetSampleRate() const noexcept { return mSampleRate; }
 	void SetSampleRate(std::int32_t inSampleRate) noexcept { mSampleRate = inSampleRate; }
 

@@ -5,7 +5,7 @@
 ///
 /// Words come from the localiser (zoncore/Localizer.h) by key; numbers and abbreviations are filled in. A value that a
 /// function does not know gives an empty text, and no key is looked up for it. Each function returns a new text, takes no
-/// lock of this library and may be called from any thread.
+/// lock of this library and may be called from any thread. It throws what a string throws when memory runs out.
 
 #include "zoncore/Geometry.h"
 #include "zoncore/UTF16String.h"

@@ -111,7 +111,8 @@ ChannelConversionMatrix SilentMatrix(std::size_t inSourceCount, std::size_t inDe
 
 void RouteEqually(MatrixRow& outRow)
 {
-	std::ranges::fill(outRow, 1.0 / static_cast<double>(outRow.size()));
+	if (!outRow.empty())
+		std::ranges::fill(outRow, 1.0 / static_cast<double>(outRow.size()));
 }
 
 // Equal shares of all source channels whose speakers are nearest to inLabel; silence when none has a speaker.
