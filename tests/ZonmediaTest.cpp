@@ -12,6 +12,7 @@ namespace
 
 using nlohmann::json;
 using testing::HasSubstr;
+using testing::Not;
 
 const std::string kClip = ZON_CLIP;
 
@@ -104,6 +105,7 @@ TEST(Zonmedia, PrintsOneDocument)
 		{{"/isReordering", true}, {"/ordering/2/label", "Ls"}, {"/ordering/2/source", 4}});
 	ExpectFacts(
 		Document({"audio", "map", "Stereo", "L_R_C"}), {{"/isReordering", false}, {"/ordering", json::array()}});
+	ExpectFacts(Document({"audio", "layout", "lfe"}), {{"/description", "1 Channel (LFE)"}});
 	ExpectFacts(Document({"video", "formats"}),
 		{{"/count", 74}, {"/formats/15/name", "BGRA_4444_8u"}, {"/formats/15/properties", 0x40080},
 			{"/formats/73/code", "Yv1F"}, {"/formats/73/chroma", "4:2:0"}});
@@ -137,6 +139,45 @@ TEST(Zonmedia, PrintsOneDocument)
 	ExpectFacts(Document({"samples", "48000", "--rate", "48000", "--format", "samples", "--fps", "25"}),
 		{{"/positions/0/sampleRate", 48'000}, {"/positions/0/formats/2/format", "timecode"},
 			{"/positions/0/formats/2/text", "00:00:01:00"}});
+}
+
+TEST(Zonmedia, ShowsChannelsInTables)
+{
+	const std::vector<LineCase> cases = {
+		{{"audio", "matrix", "L,L,LFE", "R,L"}, R"(3 Channels (L L LFE) to 2 Channels (R L)
+
+  Matrix
+       L    L  LFE
+  R  0.5  0.5    .
+  L    1    .    .
+
+  No channel takes LFE
+)"},
+		{{"audio", "matrix", "*,*", "*"}, R"(2 Channels to Mono
+
+  Matrix
+     *  *
+  *  1  .
+
+  No channel takes *(1)
+)"},
+		{{"audio", "map", "*,L", "L,*"}, R"(2 Channels (* L) to 2 Channels (L *)
+
+  Ordering
+  Destination  Label  Source
+            0  L           1
+            1  *           0
+)"},
+		{{"audio", "map", "51", "Stereo"},
+			"5.1 (L, R, C, LFE, Ls, Rs) to Stereo\n  Is reordering  no: the layouts have 6 and 2 channels\n"},
+		{{"audio", "map", "L,L", "L,C"},
+			"2 Channels (L L) to 2 Channels (L C)\n  Is reordering  no: the source has no C\n"},
+		{{"audio", "map", "*,L", "*,*"},
+			"2 Channels (* L) to 2 Channels\n  Is reordering  no: the source has fewer channels without a label\n"},
+	};
+	for (const LineCase& testCase : cases)
+		EXPECT_EQ(Zonmedia(testCase.mArguments).mOutput, testCase.mLine);
+	EXPECT_THAT(Zonmedia({"audio", "layout", "LFE"}).mOutput, Not(HasSubstr(" \n")));
 }
 
 // ---- Complaints ------------------------------------------------------------------------------------------------------

@@ -3,6 +3,7 @@
 #include "zonmedia/Commands.h"
 #include "zonmediatypes/Descriptions.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <string>
@@ -51,10 +52,11 @@ Value ChannelsOf(const AudioChannelLayout& inLayout)
 
 Status RunLayouts(const CommonArguments& inArguments)
 {
-	Table table{"Layouts", {"Name", "Count", "Channels", "Description"}, {}};
+	// The channels come last: a single long list of them would keep all descriptions off a terminal.
+	Table table{"Layouts", {"Name", "Count", "Description", "Channels"}, {}};
 	for (const auto& [name, layout] : LayoutNames())
 		table.mRows.push_back(
-			{name, static_cast<std::int64_t>(layout.size()), ChannelsOf(layout), Description(layout)});
+			{name, static_cast<std::int64_t>(layout.size()), Description(layout), ChannelsOf(layout)});
 	Print({{"", ""}, {std::move(table)}}, inArguments.GetStyle());
 	return Status::Fine;
 }
@@ -112,17 +114,27 @@ Grid MatrixGrid(
 	return {std::move(table), std::move(gains)};
 }
 
-// The source channels that no destination channel takes.
-AudioChannelLayout Untaken(const AudioChannelLayout& inFrom, const ChannelConversionMatrix& inMatrix)
+// A channel by its abbreviation, with its number where that alone would not tell which.
+std::string ChannelName(const AudioChannelLayout& inLayout, std::size_t inIndex)
 {
-	AudioChannelLayout untaken;
+	const std::string name = Abbreviation(inLayout[inIndex].mLabel);
+	return std::ranges::count(inLayout, inLayout[inIndex]) == 1 ? name : name + "(" + std::to_string(inIndex) + ")";
+}
+
+// The source channels that no destination channel takes, for people by name.
+Value Untaken(const AudioChannelLayout& inFrom, const ChannelConversionMatrix& inMatrix)
+{
+	std::string text;
+	Json array = Json::array();
 	for (std::size_t column = 0; column < inFrom.size(); ++column)
 	{
 		const auto takes = [column](const auto& inRow) { return inRow[column] != 0.0; };
-		if (std::ranges::none_of(inMatrix, takes))
-			untaken.push_back(inFrom[column]);
+		if (std::ranges::any_of(inMatrix, takes))
+			continue;
+		text.append(text.empty() ? "" : " ").append(ChannelName(inFrom, column));
+		array.push_back(Abbreviation(inFrom[column].mLabel));
 	}
-	return untaken;
+	return {text, array};
 }
 
 Record ConversionRecord(const AudioChannelLayout& inFrom, const AudioChannelLayout& inTo)
@@ -145,7 +157,7 @@ Status RunMatrix(const ConversionArguments& inArguments)
 	ComputeChannelConversionMatrix(from, to, matrix);
 	Record record = ConversionRecord(from, to);
 	record.mItems.emplace_back(MatrixGrid(from, to, matrix));
-	const Value untaken = ChannelsOf(Untaken(from, matrix));
+	const Value untaken = Untaken(from, matrix);
 	if (!untaken.mText.empty())
 		record.mItems.emplace_back(Note{"No channel takes " + untaken.mText});
 	record.mItems.emplace_back(Field{"Untaken", {"", untaken.mJson}});
@@ -155,6 +167,18 @@ Status RunMatrix(const ConversionArguments& inArguments)
 
 // ---- map -------------------------------------------------------------------------------------------------------------
 
+std::string WhyNoReordering(const AudioChannelLayout& inFrom, const AudioChannelLayout& inTo)
+{
+	if (inFrom.size() != inTo.size())
+		return "the layouts have " + std::to_string(inFrom.size()) + " and " + std::to_string(inTo.size())
+			+ " channels";
+	const auto isMissing
+		= [&](AudioChannelDescription inChannel) { return !HasChannelLabel(inFrom, inChannel.mLabel); };
+	const auto missing = std::ranges::find_if(inTo, isMissing);
+	return missing != inTo.end() ? "the source has no " + Abbreviation(missing->mLabel)
+								 : "the source has fewer channels without a label";
+}
+
 Status RunMap(const ConversionArguments& inArguments)
 {
 	const AudioChannelLayout from = ReadLayout(inArguments.mFrom);
@@ -162,8 +186,8 @@ Status RunMap(const ConversionArguments& inArguments)
 	ChannelOrdering ordering;
 	const bool isReordering = RemapChannelOrdering(from, to, ordering);
 	Record record = ConversionRecord(from, to);
-	record.mItems.emplace_back(Field{"Is reordering",
-		{isReordering ? "" : "no: a destination channel has no source, or the counts differ", isReordering}});
+	record.mItems.emplace_back(
+		Field{"Is reordering", {isReordering ? "" : "no: " + WhyNoReordering(from, to), isReordering}});
 	Table table{"Ordering", {"Destination", "Label", "Source"}, {}};
 	for (std::size_t channel = 0; channel < ordering.size(); ++channel)
 		table.mRows.push_back({static_cast<std::int64_t>(channel), Abbreviation(to[channel].mLabel),
@@ -175,7 +199,8 @@ Status RunMap(const ConversionArguments& inArguments)
 
 // ---- Arguments -------------------------------------------------------------------------------------------------------
 
-constexpr const char* kLayoutHelp = "A name of the catalogue (Broadcast51), or abbreviations (L,R,C,LFE,Ls,Rs)";
+constexpr const char* kLayoutHelp
+	= "A name of the catalogue (Broadcast51), or abbreviations (L,R,LFE; \"*\" has no label)";
 
 void AddConversionCommand(CLI::App& ioAudio, Run& outRun, const char* inName, const char* inDescription,
 	const char* inExamples, Status (*inRun)(const ConversionArguments&))

@@ -55,9 +55,9 @@ std::span<const Named<AudioChannelLayout>> LayoutNames()
 
 AudioChannelLayout ReadLayout(std::string_view inText)
 {
-	const auto labels = AllAudioChannelLabels();
-	const bool isOneLabel = std::ranges::find(labels, inText, Abbreviation) != labels.end();
-	if (isOneLabel || inText.find(',') != std::string_view::npos)
+	const auto isMeant
+		= [inText](AudioChannelLabel inLabel) { return EditDistance(Abbreviation(inLabel), inText) == 0; };
+	if (std::ranges::any_of(AllAudioChannelLabels(), isMeant) || inText.find(',') != std::string_view::npos)
 		return ReadAbbreviations(inText);
 	return ValueNamed<AudioChannelLayout>(LayoutNames(), "layout", inText);
 }

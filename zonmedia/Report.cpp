@@ -90,6 +90,11 @@ std::size_t ColumnWidth(const Table& inTable, std::size_t inColumn)
 	return std::accumulate(inTable.mRows.begin(), inTable.mRows.end(), Width(inTable.mColumns[inColumn]), widest);
 }
 
+std::string WithoutBlanksAtTheEnd(std::string_view inLine)
+{
+	return std::string(inLine.substr(0, inLine.find_last_not_of(' ') + 1));
+}
+
 void WriteTable(const Table& inTable, Style inStyle)
 {
 	if (inTable.mRows.empty())
@@ -99,9 +104,7 @@ void WriteTable(const Table& inTable, Style inStyle)
 	for (std::size_t column = 0; column < inTable.mColumns.size(); ++column)
 	{
 		const bool toTheRight = IsColumnOfNumbers(inTable, column);
-		// The last column is not padded: no line ends with blanks.
-		const bool isLast = column + 1 == inTable.mColumns.size();
-		const std::size_t width = isLast && !toTheRight ? 0 : ColumnWidth(inTable, column);
+		const std::size_t width = ColumnWidth(inTable, column);
 		const std::string_view gap = column == 0 ? kIndent : kGap;
 		head.append(gap).append(Padded(inTable.mColumns[column], width, toTheRight));
 		for (std::size_t row = 0; row < lines.size(); ++row)
@@ -110,9 +113,9 @@ void WriteTable(const Table& inTable, Style inStyle)
 	if (!inTable.mName.empty())
 		std::cout << '\n' << kIndent << Coloured(inTable.mName, kBold, inStyle) << '\n';
 	if (head.find_first_not_of(' ') != std::string::npos)
-		std::cout << Coloured(head, kDim, inStyle) << '\n';
+		std::cout << Coloured(WithoutBlanksAtTheEnd(head), kDim, inStyle) << '\n';
 	for (const std::string& line : lines)
-		std::cout << line << '\n';
+		std::cout << WithoutBlanksAtTheEnd(line) << '\n';
 }
 
 // Writes the items of a record for people, one overload a kind.
@@ -132,12 +135,14 @@ struct ItemWriter
 	void operator()(const Note& inNote) const { std::cout << '\n' << kIndent << Printable(inNote.mText) << '\n'; }
 };
 
+// The widest name of those that people see.
 std::size_t FieldNameWidth(const Record& inRecord)
 {
 	std::size_t width = 0;
 	for (const auto& item : inRecord.mItems)
 	{
-		if (const auto* field = std::get_if<Field>(&item))
+		const auto* field = std::get_if<Field>(&item);
+		if (field != nullptr && !field->mValue.mText.empty())
 			width = std::max(width, Width(field->mName));
 	}
 	return width;
