@@ -61,6 +61,7 @@ struct Chroma
 	PixelFormatSubsampling mCode;
 	std::string_view mText;
 };
+// NOLINTBEGIN(readability-identifier-naming): rows read as their words do
 inline constexpr Chroma C4444{kPixelFormatSubsampling_444, "4444"};
 inline constexpr Chroma C444{kPixelFormatSubsampling_444, "444"};
 inline constexpr Chroma C422{kPixelFormatSubsampling_422, "422"};
@@ -85,6 +86,7 @@ inline constexpr auto MPEG2Field = kPixelFormatCompression_MPEG2Field;
 inline constexpr auto MPEG2Frame = kPixelFormatCompression_MPEG2Frame;
 inline constexpr auto MPEG4Field = kPixelFormatCompression_MPEG4Field;
 inline constexpr auto MPEG4Frame = kPixelFormatCompression_MPEG4Frame;
+// NOLINTEND(readability-identifier-naming)
 
 // Whether inWord stands in a constant's name, between underscores.
 consteval bool Says(std::string_view inName, std::string_view inWord)

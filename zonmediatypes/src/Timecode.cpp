@@ -217,7 +217,7 @@ void WriteUsualText(HMSF inFields, char inFrameSeparator, UTF16Char* outText)
 	WriteTwoDigits(inFields.mMinutes, outText + 3);
 	outText[5] = ':';
 	WriteTwoDigits(inFields.mSeconds, outText + 6);
-	outText[8] = static_cast<UTF16Char>(inFrameSeparator);
+	outText[8] = static_cast<unsigned char>(inFrameSeparator);
 	WriteTwoDigits(inFields.mFrames, outText + 9);
 }
 
