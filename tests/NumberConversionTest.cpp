@@ -124,7 +124,7 @@ TEST(NumberToString, WritesTextThatIsTooLongInGeneralNotation)
 	EXPECT_EQ(Format(7, 5, 0, 0, 4), "7");
 	EXPECT_EQ(Format(7, 5, 0, 0, 5), "00007");
 	for (const int length : {0, -1, INT_MIN})
-		EXPECT_EQ(Format(1, 1, 1, 0, length), "1");
+		EXPECT_EQ(Format(0.5, 1, 0, 0, length), "0.5");
 }
 
 TEST(NumberToString, TakesCountsOfAnySize)
