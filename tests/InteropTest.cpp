@@ -91,6 +91,7 @@ template <class T>
 std::string Stream(const T& inValue)
 {
 	std::ostringstream stream;
+	stream.imbue(std::locale::classic());
 	stream << inValue;
 	return stream.str();
 }

@@ -13,6 +13,7 @@
 #include <csignal>
 #include <iomanip>
 #include <limits>
+#include <locale>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -236,6 +237,7 @@ TEST(TickTimeText, IsSeconds)
 	const auto narrow = [](TickTime inTime, auto... inManipulators)
 	{
 		std::ostringstream stream;
+		stream.imbue(std::locale::classic());
 		((stream << inManipulators), ...);
 		stream << inTime;
 		return stream.str();

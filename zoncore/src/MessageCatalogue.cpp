@@ -8,8 +8,8 @@
 #include <compare>
 #include <cstdint>
 #include <cstdio>
-#include <cstring>
 #include <memory>
+#include <string.h>
 #include <utility>
 
 namespace zoncore::config
@@ -114,6 +114,13 @@ std::strong_ordering CompareId(std::string_view inId, std::string_view inContext
 	return inId.substr(contextBytes + 1) <=> inText;
 }
 
+// What the system says of its last error; in English, whatever the process's locale is.
+const char* SystemReason()
+{
+	const char* const reason = ::strerrordesc_np(errno);
+	return reason != nullptr ? reason : "unknown error";
+}
+
 struct CloseFile
 {
 	void operator()(std::FILE* inFile) const { std::fclose(inFile); }
@@ -168,7 +175,7 @@ bool MessageCatalogue::Load(const std::string& inPath, std::string& outError)
 	const std::unique_ptr<std::FILE, CloseFile> file(std::fopen(inPath.c_str(), "rb"));
 	if (file == nullptr)
 	{
-		outError = inPath + ": cannot be opened: " + std::strerror(errno);
+		outError = inPath + ": cannot be opened: " + SystemReason();
 		return false;
 	}
 	std::string bytes;
@@ -184,7 +191,7 @@ bool MessageCatalogue::Load(const std::string& inPath, std::string& outError)
 	}
 	if (std::ferror(file.get()) != 0)
 	{
-		outError = inPath + ": cannot be read: " + std::strerror(errno);
+		outError = inPath + ": cannot be read: " + SystemReason();
 		return false;
 	}
 	std::string error;

@@ -21,7 +21,17 @@
 	#include <fmt/ostream.h>
 
 // clang-format off
-template <> struct fmt::formatter<zonmediatypes::TickTime> : fmt::ostream_formatter {};
+// Its number would follow the global locale, which the streams of fmt take over.
+template <>
+struct fmt::formatter<zonmediatypes::TickTime> : fmt::formatter<std::string>
+{
+	template <class Context>
+	auto format(zonmediatypes::TickTime inTime, Context& ioContext) const
+	{
+		return fmt::formatter<std::string>::format(
+			zoncore::detail::TextOf([&](std::ostream& ioStream) { ioStream << inTime; }), ioContext);
+	}
+};
 template <> struct fmt::formatter<zonmediatypes::FrameRate> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::TimeBase> : fmt::ostream_formatter {};
 template <> struct fmt::formatter<zonmediatypes::AudioChannelLabel> : fmt::ostream_formatter {};
