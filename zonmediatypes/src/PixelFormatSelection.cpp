@@ -265,13 +265,12 @@ PixelFormat Select4444PixelFormat(PixelFormat inFormat, RenderQuality inQuality)
 {
 	if (Is4444(inFormat))
 		return inFormat.mName == kPixelFormatFourCC_Invalid ? kPixelFormat_Invalid : inFormat;
-	PixelFormatProperties working = To4444(inFormat.mProperties, inQuality);
+	const PixelFormatProperties working = To4444(inFormat.mProperties, inQuality);
 	const PixelFormatName name = GuessNameForProperties(working);
 	if (name == kPixelFormatFourCC_Any)
 		return kPixelFormat_Any;
 	if (name == kPixelFormatFourCC_Invalid)
 		return kPixelFormat_Invalid;
-	working.SetKind(kPixelFormatKind_Concrete);
 	return {name, working};
 }
 
