@@ -51,7 +51,7 @@ struct LineCase
 {
 	std::vector<std::string> mArguments;
 	std::string mLine;
-	std::string mInput = "";
+	std::string mInput{};
 };
 
 TEST(Zonmedia, PrintsTheResultAlone)

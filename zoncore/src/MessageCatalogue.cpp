@@ -8,8 +8,8 @@
 #include <compare>
 #include <cstdint>
 #include <cstdio>
+#include <cstring>
 #include <memory>
-#include <string.h>
 #include <utility>
 
 namespace zoncore::config
