@@ -128,13 +128,46 @@ std::basic_string<UTF16Char> std::numpunct<UTF16Char>::do_falsename() const
 template class std::num_get<UTF16Char>;
 template class std::num_put<UTF16Char>;
 
+namespace
+{
+
+// A facet that no locale deletes, in memory of its own that is never given back: streams may still be made while static
+// objects are destroyed.
+template <class Facet>
+union PermanentFacet
+{
+	struct Kept : Facet
+	{
+		Kept() : Facet(1) {}   // the reference that stays
+	};
+
+	PermanentFacet() : mFacet() {}
+	PermanentFacet(const PermanentFacet&) = delete;
+	PermanentFacet& operator=(const PermanentFacet&) = delete;
+	~PermanentFacet() {}
+
+	Kept mFacet;
+};
+
+template <class Facet>
+Facet* GetPermanentFacet()
+{
+	static PermanentFacet<Facet> sFacet;
+	return &sFacet.mFacet;
+}
+
+template <class Facet>
+std::locale With(const std::locale& inLocale)
+{
+	return std::locale(inLocale, GetPermanentFacet<Facet>());
+}
+
+}   // namespace
+
 const std::locale& zoncore::ClassicUTF16Locale()
 {
-	// Never destroyed: streams may still be made while other static objects are.
-	static const std::locale& sLocale = *new std::locale(
-		std::locale(
-			std::locale(std::locale(std::locale::classic(), new std::ctype<UTF16Char>), new std::numpunct<UTF16Char>),
-			new std::num_put<UTF16Char>),
-		new std::num_get<UTF16Char>);
+	// Never destroyed, for the same reason.
+	static const std::locale& sLocale = *new std::locale(With<std::num_get<UTF16Char>>(With<std::num_put<UTF16Char>>(
+		With<std::numpunct<UTF16Char>>(With<std::ctype<UTF16Char>>(std::locale::classic())))));
 	return sLocale;
 }
