@@ -8,9 +8,11 @@
 ///     kMpegClock->FromTicks(TickTime(254'016'000'000), Rounding::Nearest);      // 90000
 ///
 /// A conversion multiplies and divides in 128 bits where it must, so it is off by nothing but its rounding. Each is
-/// constexpr, allocates nothing and costs one division by a run-time number, or a multiplication where the time base is a
-/// constant.
+/// constexpr, allocates nothing and divides by multiplying, also where the time base is known at run time only: making one
+/// costs two divisions of 128 bits, so keep it. A product beyond 64 bits costs a division of 128 bits in each conversion.
 
+#include "zoncore/Reciprocal.h"
+#include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/TickTime.h"
 
 #include <cstdint>
@@ -54,16 +56,33 @@ public:
 	constexpr std::optional<Ratio> ToRatio() const noexcept;
 
 	/// Whether every unit is a whole number of ticks: ToTicks then rounds nothing.
-	constexpr bool IsExact() const noexcept { return mUnits == 1; }
+	constexpr bool IsExact() const noexcept { return mUnits.mNumber == 1; }
 
 	friend constexpr bool operator==(const TimeBase&, const TimeBase&) noexcept = default;
 
 private:
+	/// A positive number that is multiplied and divided by.
+	struct Term
+	{
+		explicit constexpr Term(std::int64_t inNumber) noexcept
+			: mNumber(inNumber), mReciprocal(static_cast<std::uint64_t>(inNumber))
+		{
+		}
+
+		friend constexpr bool operator==(const Term&, const Term&) noexcept = default;
+
+		std::int64_t mNumber;
+		zoncore::utility::Reciprocal mReciprocal;
+	};
+
 	constexpr TimeBase(std::int64_t inTicks, std::int64_t inUnits) noexcept : mTicks(inTicks), mUnits(inUnits) {}
 
-	// mTicks ticks last as long as mUnits units; both are positive and have no common divisor.
-	std::int64_t mTicks;
-	std::int64_t mUnits;
+	static constexpr std::optional<std::int64_t> Rescale(
+		std::int64_t inValue, const Term& inFactor, const Term& inDivisor, Rounding inRounding) noexcept;
+
+	// mTicks ticks last as long as mUnits units; both have no common divisor.
+	Term mTicks;
+	Term mUnits;
 };
 
 // ---- Inline implementation -------------------------------------------------------------------------------------------
@@ -71,37 +90,53 @@ private:
 namespace detail
 {
 
-__extension__ using Int128 = __int128;
+__extension__ using UInt128 = unsigned __int128;
 
-/// inDividend / inDivisor, rounded; inDivisor is positive.
-template <class Integer>
-constexpr Integer DivideRounded(Integer inDividend, std::int64_t inDivisor, Rounding inRounding) noexcept
+/// What the magnitude of a dividend grows by, so that its truncated quotient is the rounded one.
+constexpr std::uint64_t RoundingBias(std::uint64_t inDivisor, bool inIsNegative, Rounding inRounding) noexcept
 {
-	const Integer quotient = inDividend / inDivisor;
-	const auto rest = static_cast<std::int64_t>(inDividend % inDivisor);
-	if (rest == 0 || inRounding == Rounding::TowardZero)
-		return quotient;
-	const bool isNegative = rest < 0;
-	const std::int64_t distance = isNegative ? -rest : rest;
-	const bool goesAway = inRounding == Rounding::Nearest ? distance >= inDivisor - distance
-														  : isNegative == (inRounding == Rounding::Down);
-	return quotient + (!goesAway ? 0 : isNegative ? -1 : 1);
-}
-
-/// inValue x inFactor / inDivisor, rounded; empty when it does not fit. The terms are positive.
-constexpr std::optional<std::int64_t> Rescale(
-	std::int64_t inValue, std::int64_t inFactor, std::int64_t inDivisor, Rounding inRounding) noexcept
-{
-	std::int64_t product = 0;
-	if (!__builtin_mul_overflow(inValue, inFactor, &product))
-		return DivideRounded(product, inDivisor, inRounding);
-	const Int128 result = DivideRounded(Int128{inValue} * inFactor, inDivisor, inRounding);
-	if (result < std::numeric_limits<std::int64_t>::min() || result > std::numeric_limits<std::int64_t>::max())
-		return std::nullopt;
-	return static_cast<std::int64_t>(result);
+	switch (inRounding)
+	{
+	case Rounding::TowardZero:
+		break;
+	case Rounding::Down:
+		return inIsNegative ? inDivisor - 1 : 0;
+	case Rounding::Up:
+		return inIsNegative ? 0 : inDivisor - 1;
+	case Rounding::Nearest:
+		return inDivisor / 2;
+	}
+	return 0;
 }
 
 }   // namespace detail
+
+// inValue x inFactor / inDivisor, rounded; empty when it does not fit.
+constexpr std::optional<std::int64_t> TimeBase::Rescale(
+	std::int64_t inValue, const Term& inFactor, const Term& inDivisor, Rounding inRounding) noexcept
+{
+	using zoncore::utility::Magnitude;
+	const auto divisor = static_cast<std::uint64_t>(inDivisor.mNumber);
+	const std::uint64_t bias = detail::RoundingBias(divisor, inValue < 0, inRounding);
+	std::int64_t product = 0;
+	if (!__builtin_mul_overflow(inValue, inFactor.mNumber, &product))
+	{
+		const std::uint64_t dividend = Magnitude(product) + bias;
+		if (dividend < zoncore::utility::Reciprocal::kMostDividend)
+		{
+			const auto quotient = static_cast<std::int64_t>(inDivisor.mReciprocal.Divide(dividend));
+			return inValue < 0 ? -quotient : quotient;
+		}
+	}
+	const detail::UInt128 dividend
+		= detail::UInt128{Magnitude(inValue)} * static_cast<std::uint64_t>(inFactor.mNumber) + bias;
+	const detail::UInt128 quotient = dividend / divisor;
+	const std::uint64_t most = Magnitude(std::numeric_limits<std::int64_t>::max()) + (inValue < 0 ? 1 : 0);
+	if (quotient > most)
+		return std::nullopt;
+	const auto magnitude = static_cast<std::uint64_t>(quotient);
+	return static_cast<std::int64_t>(inValue < 0 ? 0 - magnitude : magnitude);
+}
 
 constexpr std::optional<TimeBase> TimeBase::FromRatio(std::int64_t inNumerator, std::int64_t inDenominator) noexcept
 {
@@ -125,21 +160,21 @@ constexpr std::optional<TimeBase> TimeBase::FromRate(FrameRate inRate) noexcept
 
 constexpr std::optional<TimeBase::Ratio> TimeBase::ToRatio() const noexcept
 {
-	const std::int64_t common = std::gcd(mTicks, kTicksPerSecond);
+	const std::int64_t common = std::gcd(mTicks.mNumber, kTicksPerSecond);
 	std::int64_t denominator = 0;
-	if (__builtin_mul_overflow(kTicksPerSecond / common, mUnits, &denominator))
+	if (__builtin_mul_overflow(kTicksPerSecond / common, mUnits.mNumber, &denominator))
 		return std::nullopt;
-	return Ratio{mTicks / common, denominator};
+	return Ratio{mTicks.mNumber / common, denominator};
 }
 
 constexpr std::optional<std::int64_t> TimeBase::FromTicks(TickTime inTime, Rounding inRounding) const noexcept
 {
-	return detail::Rescale(inTime.GetTicks(), mUnits, mTicks, inRounding);
+	return Rescale(inTime.GetTicks(), mUnits, mTicks, inRounding);
 }
 
 constexpr std::optional<TickTime> TimeBase::ToTicks(std::int64_t inUnits, Rounding inRounding) const noexcept
 {
-	const std::optional<std::int64_t> ticks = detail::Rescale(inUnits, mTicks, mUnits, inRounding);
+	const std::optional<std::int64_t> ticks = Rescale(inUnits, mTicks, mUnits, inRounding);
 	return ticks ? std::optional(TickTime(*ticks)) : std::nullopt;
 }
 
