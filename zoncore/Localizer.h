@@ -2,11 +2,22 @@
 
 /// \file
 /// Display text by key. A key is a path, "=" and the English text, as in
-/// "$$$/zonmediatypes/RenderQuality/Draft=Draft"; the host may install a translator that knows texts for keys.
+/// "$$$/zonmediatypes/RenderQuality/Draft=Draft"; the host may install a translator that knows texts for keys, or a catalogue
+/// that it has read (MessageCatalogue.h).
+///
+///     Localizer::Get().SetTranslator(
+///         [](std::string_view inKey, UTF16String& outText)
+///         {
+///             if (!inKey.starts_with("$$$/zonmediatypes/RenderQuality/Draft="))
+///                 return false;   // the English text behind "="
+///             outText = utility::UTF8to16("Entwurf");
+///             return true;
+///         });
 
 #include "zoncore/Export.h"
 #include "zoncore/UTF16String.h"
 
+#include <cstddef>
 #include <functional>
 #include <initializer_list>
 #include <memory>
@@ -61,6 +72,11 @@ namespace zoncore
 /// placeholder without replacement stays as it is, and so does "@" without a digit; "@10" is "@1" and a zero. Costs one
 /// allocation for a short text, and is linear in the text that comes out.
 ZONCORE_API UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements);
+
+/// The same into a caller's buffer, without a terminator. Returns the length of the text; a buffer that is too short for it
+/// is left alone.
+ZONCORE_API std::size_t FillPlaceholders(
+	std::span<UTF16Char> outText, UTF16StringView inTemplate, std::span<const UTF16String> inReplacements) noexcept;
 
 /// The localised text of a key with its placeholders filled; see FillPlaceholders.
 class ZString

@@ -2,7 +2,7 @@
 
 /// \file
 /// Memory for the many small, short-lived blocks of texts and tables: pooled, so that a block is served and taken back
-/// in a few nanoseconds. Every container of the public interface takes its memory here.
+/// in a few nanoseconds. 16-bit texts, channel layouts and lists of formats take theirs here.
 
 #include "zoncore/Export.h"
 

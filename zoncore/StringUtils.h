@@ -9,8 +9,8 @@
 ///
 /// Any input is legal: malformed text gives U+FFFD for each maximal ill-formed piece, as the Unicode Standard recommends
 /// (FF FF gives two, E2 82 one, two lone surrogates two). Nothing here throws but what memory running out throws, and
-/// nothing depends on a locale. Costs are linear in the text, one allocation where the result does not fit into the
-/// string object itself. Safe on any thread.
+/// nothing depends on a locale. A conversion between encodings is linear in the text, with one allocation where the result
+/// does not fit into the string object itself. Safe on any thread.
 
 #include "zoncore/Export.h"
 #include "zoncore/UTF16String.h"

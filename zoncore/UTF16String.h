@@ -37,7 +37,6 @@ namespace zoncore
 using UTF16Char = unsigned short;
 
 /// Text of UTF-16 code units. Up to seven are held without memory from the allocator.
-
 using UTF16String
 	= std::basic_string<UTF16Char, std::char_traits<UTF16Char>, utility::SmallBlockAllocator::Allocator<UTF16Char>>;
 

@@ -17,6 +17,7 @@
 #include "zonmediatypes/PixelFormatSelection.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string_view>
@@ -29,6 +30,11 @@ namespace zonmediatypes
 /// The rate with its unit: "48000Hz" for a rate of 8,000 Hz and above, "29.97fps" for every slower one, "0fps" for
 /// kFrameRate_Zero. A duration of 0 and below counts as an audio rate: "infHz", "-29.97Hz".
 ZONMEDIATYPES_API zoncore::UTF16String FrameRateDescription(FrameRate inRate);
+
+/// The same text into a caller's buffer, UTF-16 or UTF-8, without a terminator. Returns its length; a buffer that is too
+/// short for it is left alone. No length is always enough, since the unit may be translated: compare the two.
+ZONMEDIATYPES_API std::size_t FrameRateDescription(std::span<zoncore::UTF16Char> outText, FrameRate inRate);
+ZONMEDIATYPES_API std::size_t FrameRateDescription(std::span<char> outText, FrameRate inRate);
 
 /// The name of a display: "29.97 fps Drop-Frame Timecode"; empty for kTimeDisplay_Auto.
 ZONMEDIATYPES_API zoncore::UTF16String TimeDisplayDescription(TimeDisplay inDisplay);
@@ -45,7 +51,7 @@ ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviations(AudioChann
 /// The short form of a label in English, never translated.
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviationsUnlocalized(AudioChannelLabel inLabel);
 
-/// One line for a layout: "Mono" and "6 Channels" without labels; "Stereo", "5.1 (L, R, C, LFE, Ls, Rs)" and
+/// One line for a layout: "0 Channels", "Mono" and "6 Channels" without labels; "Stereo", "5.1 (L, R, C, LFE, Ls, Rs)" and
 /// "SMPTE DTV (L R C LFE Ls Rs Lt Rt)" for well-known ones, of which only 5.1 is known in any order; for others their
 /// labels, "4 Channels (L R Ls Rs)", of which more than eight channels show the first seven,
 /// "24 Channels (L R C LFE Ls Rs Lc...)". A number that names no label shows as nothing: "1 Channel ()".
@@ -79,7 +85,8 @@ ZONMEDIATYPES_API zoncore::UTF16String FieldTypeDescription(FieldType inType);
 
 /// "BGRA 4444 8u", "VUYA 4444 32f 709", "NTSC DV 50", "YUV 420 MPEG2 Frame 8u Full Range". Formed from the properties:
 /// UYVY is "VUY 422 8u", YUYV "YUV 422 8u" and r210 "BGR 4444 10u". The name stands only in the texts of custom formats and
-/// of unknown compression, its characters from the last to the first (deliberate): "Custom Pixel Format (cba_)".
+/// of unknown compression, its characters from the last to the first (deliberate): "Custom Pixel Format (cba_)". The wildcard
+/// is "Any Pixel Format", what is invalid "Unknown Pixel Format"; a compression code that is not assigned has no text.
 ZONMEDIATYPES_API zoncore::UTF16String PixelFormatDescription(PixelFormat inFormat);
 
 /// The name of the first well-known shape that is equal under the tolerant comparison, with the ratio as a number:

@@ -59,21 +59,32 @@ void TakeApart(
 }
 
 template <class Char>
-UTF16String Fill(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
+std::size_t FilledLength(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
 {
 	std::size_t length = 0;
 	TakeApart(
 		inTemplate, inReplacements, [&](UTF16Char) { ++length; },
 		[&](const UTF16String& inText) { length += inText.size(); });
-	UTF16String filled(length, 0);
-	UTF16Char* end = filled.data();
+	return length;
+}
+
+template <class Char>
+void Fill(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements, UTF16Char* outText)
+{
 	TakeApart(
-		inTemplate, inReplacements, [&](UTF16Char inChar) { *end++ = inChar; },
+		inTemplate, inReplacements, [&](UTF16Char inChar) { *outText++ = inChar; },
 		[&](const UTF16String& inText)
 		{
 			for (const UTF16Char unit : inText)   // most are too short for memcpy to pay
-				*end++ = unit;
+				*outText++ = unit;
 		});
+}
+
+template <class Char>
+UTF16String Filled(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
+{
+	UTF16String filled(FilledLength(inTemplate, inReplacements), 0);
+	Fill(inTemplate, inReplacements, filled.data());
 	return filled;
 }
 
@@ -107,7 +118,7 @@ UTF16String config::Localizer::Lookup(std::string_view inKey, std::span<const UT
 	const auto catalogue = sCatalogue.Get();
 	const std::string_view pattern = TextOf(catalogue.get(), inKey, EnglishText(inKey));
 	const bool isAscii = std::ranges::all_of(pattern, [](unsigned char inByte) { return inByte < 0x80; });
-	return isAscii ? Fill(pattern, inReplacements) : FillPlaceholders(utility::UTF8to16(pattern), inReplacements);
+	return isAscii ? Filled(pattern, inReplacements) : FillPlaceholders(utility::UTF8to16(pattern), inReplacements);
 }
 
 void config::Localizer::SetTranslator(Translator inTranslator)
@@ -122,7 +133,16 @@ void config::Localizer::SetCatalogue(const std::shared_ptr<const MessageCatalogu
 
 UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements)
 {
-	return Fill(inTemplate, inReplacements);
+	return Filled(inTemplate, inReplacements);
+}
+
+std::size_t FillPlaceholders(
+	std::span<UTF16Char> outText, UTF16StringView inTemplate, std::span<const UTF16String> inReplacements) noexcept
+{
+	const std::size_t length = FilledLength(inTemplate, inReplacements);
+	if (length <= outText.size())
+		Fill(inTemplate, inReplacements, outText.data());
+	return length;
 }
 
 }   // namespace zoncore

@@ -111,6 +111,15 @@ UTF16Char* WriteUTF16(UTF16Char* outText, char32_t inCodePoint)
 	return outText + 2;
 }
 
+// How many bytes inText can take in UTF-8; a surrogate is counted as a lone one.
+std::size_t MostUTF8Bytes(UTF16StringView inText)
+{
+	std::size_t bytes = 0;
+	for (const UTF16Char unit : inText)
+		bytes += unit < 0x80 ? 1 : unit < 0x800 ? 2 : 3;
+	return bytes;
+}
+
 void AppendUTF8(std::string& ioText, char32_t inCodePoint)
 {
 	const auto continuation
@@ -174,7 +183,9 @@ UTF16String UTF8to16(std::string_view inText)
 std::string UTF16to8(UTF16StringView inText)
 {
 	const std::size_t ascii = CountAscii(inText);
-	std::string text(ascii, '\0');
+	std::string text;
+	text.reserve(ascii + MostUTF8Bytes(inText.substr(ascii)));
+	text.resize(ascii);
 	std::ranges::transform(
 		inText.substr(0, ascii), text.begin(), [](UTF16Char inChar) { return static_cast<char>(inChar); });
 	inText.remove_prefix(ascii);

@@ -6,6 +6,7 @@
 #include "zonmediatypes/src/AudioChannelLabels.h"
 #include "zonmediatypes/src/AudioChannelLayouts.h"
 #include "zonmediatypes/src/AudioTextKeys.h"
+#include "zonmediatypes/src/RateText.h"
 #include "zonmediatypes/src/TextKeys.h"
 #include "zonmediatypes/src/TimeTextKeys.h"
 #include "zonmediatypes/src/VideoTextKeys.h"
@@ -30,12 +31,37 @@ using zoncore::utility::UTF8to16;
 
 // ---- Time ------------------------------------------------------------------------------------------------------------
 
-UTF16String FrameRateDescription(FrameRate inRate)
+namespace
+{
+
+UTF16String RateFormat(FrameRate inRate)
 {
 	const bool isAudio = inRate.GetTicksPerFrame() <= kFrameRate_Audio8000.GetTicksPerFrame();
-	const UTF16String format = Localizer::Get().Lookup(isAudio ? kAudioRateKey : kVideoRateKey);
+	return Localizer::Get().Lookup(isAudio ? kAudioRateKey : kVideoRateKey);
+}
+
+}   // namespace
+
+UTF16String FrameRateDescription(FrameRate inRate)
+{
+	const UTF16String format = RateFormat(inRate);
 	const UTF16String number = zoncore::utility::UTF8to16(boost::lexical_cast<std::string>(inRate));
 	return zoncore::FillPlaceholders(format, {&number, 1});
+}
+
+std::size_t FrameRateDescription(std::span<UTF16Char> outText, FrameRate inRate)
+{
+	const UTF16String number = RateText(inRate);
+	return zoncore::FillPlaceholders(outText, RateFormat(inRate), {&number, 1});
+}
+
+std::size_t FrameRateDescription(std::span<char> outText, FrameRate inRate)
+{
+	const UTF16String number = RateText(inRate);
+	const std::string text = UTF16to8(zoncore::FillPlaceholders(RateFormat(inRate), {&number, 1}));
+	if (text.size() <= outText.size())
+		std::ranges::copy(text, outText.begin());
+	return text.size();
 }
 
 UTF16String TimeDisplayDescription(TimeDisplay inDisplay)
