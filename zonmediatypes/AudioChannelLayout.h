@@ -97,7 +97,6 @@ struct AudioChannelDescription
 		return std::int32_t{inLHS.mLabel} <=> std::int32_t{inRHS.mLabel};
 	}
 };
-static_assert(sizeof(AudioChannelDescription) == sizeof(std::int32_t));
 
 /// The channels of one stream in storage order: the index of a description is the number of the channel.
 using AudioChannelLayout = zoncore::utility::SmallBlockAllocator::vector<AudioChannelDescription>;

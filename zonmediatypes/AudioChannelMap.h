@@ -84,9 +84,9 @@ public:
 	bool operator==(const ChannelMap& inOther) const noexcept;
 
 private:
-	bool Contains(std::int32_t inIndex) const noexcept;
-	void RemoveLabel(AudioChannelLabel inLabel) noexcept;
-	void PlaceLabel(AudioChannelLabel inLabel, std::int32_t inChannel);
+	ZONMEDIATYPES_INTERNAL bool Contains(std::int32_t inIndex) const noexcept;
+	ZONMEDIATYPES_INTERNAL void RemoveLabel(AudioChannelLabel inLabel) noexcept;
+	ZONMEDIATYPES_INTERNAL void PlaceLabel(AudioChannelLabel inLabel, std::int32_t inChannel);
 
 	std::vector<AudioChannelLayout> mLayouts;
 	std::vector<std::int32_t> mAssignments;   // as many as layouts

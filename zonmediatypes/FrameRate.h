@@ -9,8 +9,7 @@
 ///     kFrameRate_VideoNTSC * 2;      // kFrameRate_VideoNTSC_HD
 ///     kFrameRate_VideoPAL_HD / 2;    // kFrameRate_VideoPAL
 ///
-/// Rates are passed by value, no operation allocates memory, and every function but the stream operators is a few
-/// instructions.
+/// No operation but the stream operators allocates memory, and each is a few instructions.
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
@@ -47,16 +46,16 @@ public:
 	/// duration for a quotient that is infinite, NaN or out of range.
 	constexpr FrameRate& operator*=(int inValue) noexcept;
 	constexpr FrameRate& operator*=(double inValue) noexcept;
-	friend constexpr FrameRate operator*(FrameRate inRate, int inValue) noexcept { return inRate *= inValue; }
-	friend constexpr FrameRate operator*(FrameRate inRate, double inValue) noexcept { return inRate *= inValue; }
+	constexpr FrameRate operator*(int inValue) const noexcept { return FrameRate(*this) *= inValue; }
+	constexpr FrameRate operator*(double inValue) const noexcept { return FrameRate(*this) *= inValue; }
 
 	/// The rate becomes inValue times slower: the duration is multiplied by inValue, wrapping for an integer, truncated
 	/// toward zero for a double. kFrameRate_Film24 / 1.001 is one tick short of kFrameRate_23976, because the product of
 	/// doubles is just below a whole number: use the constants where a rate must be exact.
 	constexpr FrameRate& operator/=(int inValue) noexcept;
 	constexpr FrameRate& operator/=(double inValue) noexcept;
-	friend constexpr FrameRate operator/(FrameRate inRate, int inValue) noexcept { return inRate /= inValue; }
-	friend constexpr FrameRate operator/(FrameRate inRate, double inValue) noexcept { return inRate /= inValue; }
+	constexpr FrameRate operator/(int inValue) const noexcept { return FrameRate(*this) /= inValue; }
+	constexpr FrameRate operator/(double inValue) const noexcept { return FrameRate(*this) /= inValue; }
 
 	friend constexpr bool operator==(FrameRate inLHS, FrameRate inRHS) noexcept = default;
 
@@ -111,7 +110,7 @@ ZONMEDIATYPES_API std::span<const FrameRate> AllFrameRates() noexcept;
 
 /// How many times faster inA is than inB. 0.0 when inA's duration is 0; a very large number, not 0, when inB is
 /// kFrameRate_Zero.
-constexpr double GetFrameRateRatio(FrameRate inA, FrameRate inB) noexcept;
+constexpr double GetFrameRateRatio(const FrameRate& inA, const FrameRate& inB) noexcept;
 
 /// Writes the rate in frames or samples per second with at most two decimals, kFrameRate_23976 with three: "25", "12.5",
 /// "29.97", "23.976"; kFrameRate_Zero is "0", a duration of 0 "inf". The text is padded as any text; the other settings of
@@ -148,7 +147,7 @@ constexpr FrameRate& FrameRate::operator/=(double inValue) noexcept
 	return *this;
 }
 
-constexpr double GetFrameRateRatio(FrameRate inA, FrameRate inB) noexcept
+constexpr double GetFrameRateRatio(const FrameRate& inA, const FrameRate& inB) noexcept
 {
 	if (inA.GetTicksPerFrame() == 0)
 		return 0.0;

@@ -97,14 +97,12 @@ public:
 	constexpr bool IsYUV() const noexcept { return Get(kIsYUV) != 0; }        ///< else RGB
 	constexpr unsigned BitDepth() const noexcept { return Get(kBitDepth); }   ///< a PixelFormatBitDepth
 	constexpr bool IsFloat() const noexcept { return Get(kIsFloat) != 0; }    ///< else unsigned integers
-	constexpr bool Is709() const noexcept { return Get(kIs709) != 0; }        ///< Rec. 709 matrix, else Rec. 601
-	constexpr bool IsVideoRange() const noexcept { return Get(kIsVideoRange) != 0; }   ///< else full range
+	constexpr bool Is709() const noexcept { return Get(kIs709) != 0; }   ///< of YUV: Rec. 709 matrix, else Rec. 601
+	constexpr bool IsVideoRange() const noexcept { return Get(kIsVideoRange) != 0; }   ///< of YUV: else full range
 	constexpr unsigned Alpha() const noexcept { return Get(kAlpha); }                  ///< a PixelFormatAlpha
 	constexpr unsigned Subsampling() const noexcept { return Get(kSubsampling); }      ///< a PixelFormatSubsampling
-	constexpr bool ReversedOrder() const noexcept
-	{
-		return Get(kReversedOrder) != 0;
-	}                                                                               ///< ARGB, YUYV; else BGRA, UYVY
+	/// ARGB, YUYV; else BGRA, UYVY.
+	constexpr bool ReversedOrder() const noexcept { return Get(kReversedOrder) != 0; }
 	constexpr bool IsLinear() const noexcept { return Get(kIsLinear) != 0; }        ///< linear light
 	constexpr unsigned Compression() const noexcept { return Get(kCompression); }   ///< a PixelFormatCompression
 	constexpr unsigned Kind() const noexcept { return Get(kKind); }                 ///< a PixelFormatKind

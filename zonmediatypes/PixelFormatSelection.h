@@ -38,8 +38,9 @@ using PixelFormats = zoncore::utility::SmallBlockAllocator::vector<PixelFormat>;
 /// The cost of a conversion that cannot be done, and the highest of all.
 inline constexpr int kPixelConversionCost_Impossible = 10'000;
 
-/// What it costs to convert frames: 0 for equal properties, kPixelConversionCost_Impossible into a compressed format and
-/// from and to what is not concrete. Changes that lose something cost more at high quality.
+/// What it costs to convert frames: kPixelConversionCost_Impossible from and to what is not concrete or of unknown
+/// compression, even if it is equal; 0 for other equal properties; impossible into a compressed format; else the points of
+/// every change added up, as the \ref pixel_format_guide "guide" lists them. Losses cost more at high quality.
 ZONMEDIATYPES_API int PixelConversionCost(
 	const PixelFormatProperties& inFrom, const PixelFormatProperties& inTo, RenderQuality inQuality) noexcept;
 
@@ -48,8 +49,9 @@ ZONMEDIATYPES_API int PixelConversionCost(
 /// to the request; else a format that can be worked in. kPixelFormat_Invalid when there is none.
 ///
 /// The result can be a format that the producer does not make, or the request although neither list names it: ask for the
-/// cost of getting there. Where kPixelFormat_Any is accepted, the cheapest conversion stands for its source format, and a
-/// tie for its destination format (deliberate).
+/// cost of getting there. The cheapest conversion gives the format that it leads to. Where kPixelFormat_Any is accepted
+/// beside other formats, the first cheapest one gives the format that it starts from instead; an equally cheap one after it
+/// that is nearer to the request still gives the one that it leads to (deliberate).
 ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats,
 	PixelFormat inRequestedFormat, const PixelFormats& inDestinationFormats, RenderQuality inQuality,
 	bool inPreferRequested) noexcept;

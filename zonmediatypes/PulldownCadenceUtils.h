@@ -40,8 +40,8 @@ enum PulldownCadence : std::int32_t
 
 /// The time of the video frame that carries the film frame at inTime, a time on the grid of 4/5 of inVideoRate. Times
 /// between two film frames count as the earlier one after zero; before zero they are truncated toward zero and the
-/// cadence runs on backwards. outFlag is set for one film frame of a group, never at or before the first video frame
-/// and never for an advanced cadence.
+/// cadence runs on backwards. outFlag tells that the video frame is the second of two split ones, of which only one field
+/// belongs to the film frame; it is never set at or before the first video frame and never for an advanced cadence.
 ///
 /// The film frame is a 32-bit number. A rate that is not usable puts every time into film frame 0.
 ZONMEDIATYPES_API TickTime MapPulldownFrameTo2997Frame(

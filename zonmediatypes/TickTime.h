@@ -10,8 +10,8 @@
 ///     cut.AddFrames(90, kFrameRate_VideoPAL);    // 914,457,600,000 ticks
 ///     cut.ToFrame64(kFrameRate_VideoPAL);        // 90
 ///
-/// Times are passed by value. Arithmetic wraps on overflow and reports nothing; only division by zero is reported. No
-/// operation but the stream operators allocates memory, and each is a few instructions.
+/// Arithmetic wraps on overflow and reports nothing; only division by zero is reported. No operation but that report and
+/// the stream operators allocates memory, and each is a few instructions.
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
@@ -97,7 +97,7 @@ public:
 	constexpr TickTime operator+(const TickTime& inRHS) const noexcept { return TickTime(*this) += inRHS; }
 	constexpr TickTime operator-(const TickTime& inRHS) const noexcept { return TickTime(*this) -= inRHS; }
 
-	/// Makes this time positive, in place.
+	/// Takes the sign off, in place; the most negative tick count keeps it.
 	constexpr TickTime& Abs() noexcept;
 
 	friend constexpr auto operator<=>(const TickTime& inLHS, const TickTime& inRHS) noexcept = default;

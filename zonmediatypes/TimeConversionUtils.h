@@ -26,7 +26,9 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/Export.h"
 
+#include <cstddef>
 #include <cstdint>
+#include <span>
 
 namespace zonmediatypes::utility
 {
@@ -64,7 +66,8 @@ struct BeatInfo
 // ---- Text to samples -------------------------------------------------------------------------------------------------
 //
 // Fields are runs of the digits "0" to "9"; every other character separates, the minus sign included: negative text
-// reads back as a positive position. A field above 2,147,483,647 counts as 0.
+// reads back as a positive position. A field above 2,147,483,647 counts as 0. Only sample counts and the numbers of
+// bars-and-beats text are read with a sign, as zoncore::utility::StringToNumber reads them.
 
 /// Timecode text as a position, rounded up to the next sample. Fields are right-aligned into hours, minutes, seconds
 /// and frames, so that "3:04" is 3 s 4 frames and "10" is 10 frames; of five fields the first one is dropped. A field
@@ -131,6 +134,19 @@ ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, s
 	std::int32_t inSampleRate, TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo,
 	bool inIsDuration);
 
+/// The longest text of any position in any format.
+inline constexpr std::size_t kLongestPosition = 84;
+
+/// The same text, ASCII in any case, into a caller's buffer, without a terminator. Returns its length; a buffer that is too
+/// short for it is left alone. kLongestPosition characters are always enough. 0, and the buffer untouched, where the form
+/// above leaves its text as it is or is false.
+ZONMEDIATYPES_API std::size_t ConvertSamplesToTimecode(std::span<zoncore::UTF16Char> outText, std::int64_t inSamples,
+	std::int32_t inSampleRate, TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo,
+	bool inIsDuration);
+ZONMEDIATYPES_API std::size_t ConvertSamplesToTimecode(std::span<char> outText, std::int64_t inSamples,
+	std::int32_t inSampleRate, TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo,
+	bool inIsDuration);
+
 /// A position as timecode; frames are truncated, negative positions have "-" in front, hours do not wrap at 24.
 ///
 /// - inDropFrame: drop-frame labels, "00;01;00;02", at 1000/1001 of the nominal rate; the flags behind inFrameCountOnly
@@ -143,8 +159,9 @@ ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, s
 /// - inShowSubframes: "." and hundredths of a frame behind the frames.
 /// - inTotalMinutes: no hours; minutes count on, "62:05:00".
 ///
-/// Frames have as many digits as the largest frame number of the rate, up to four. The text is "0" for a sample rate of
-/// 0 or below, and for a frame rate below 1 (drop-frame: below 30) or whose frames per minute or hour are 0 in 32 bits.
+/// Frames have as many digits as the largest frame number of the rate, up to four, and two in drop-frame text. The text
+/// is "0" for a sample rate of 0 or below, and for a frame rate below 1 (drop-frame: below 30) or whose frames per
+/// minute or hour are 0 in 32 bits.
 ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, std::int64_t inSamples,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inDropFrame, bool inNTSC, bool inFrameCountOnly,
 	bool inOmitFrames, bool inSuppressLeadingZeros, bool inShowSubframes, bool inTotalMinutes);

@@ -2,6 +2,9 @@
 
 /// \file
 /// The whole library in one header, and the entry points that a client calls around its use of it.
+///
+/// zoncore and zonmediatypes both have a namespace `utility`: with `using namespace` for both, write zoncore::utility and
+/// zonmediatypes::utility in full.
 
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/AudioChannelMap.h"

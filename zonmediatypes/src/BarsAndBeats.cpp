@@ -77,18 +77,15 @@ struct MusicalPosition
 	Ticks mTicks;       // the same in ticks
 };
 
-// The part below the beat; one that rounds up to a whole beat is carried into ioBeats.
-Ticks SplitTicks(double& ioBeats, std::int32_t inTicksPerBeat)
+// The part below the beat. A fraction of a whole number of ticks rounds to less than that number, so that no whole beat is
+// left to carry.
+Ticks SplitTicks(double inFraction, std::int32_t inTicksPerBeat)
 {
 	if (inTicksPerBeat < 1)
 		return {};
-	const double ticks = Fraction(ioBeats) * inTicksPerBeat;
+	const double ticks = inFraction * inTicksPerBeat;
 	const auto wholeTicks = TruncateTo<std::int64_t>(ticks);
-	if (wholeTicks != inTicksPerBeat)
-		return {
-			wholeTicks, WrappingSubtract(TruncateTo<std::int64_t>(ticks * 1'000), WrappingMultiply(wholeTicks, 1'000))};
-	ioBeats += 1.0 / inTicksPerBeat;
-	return {};
+	return {wholeTicks, WrappingSubtract(TruncateTo<std::int64_t>(ticks * 1'000), WrappingMultiply(wholeTicks, 1'000))};
 }
 
 MusicalPosition SplitBeats(double inBeats, const BeatInfo& inBeatInfo, std::int64_t inBase)
@@ -97,12 +94,13 @@ MusicalPosition SplitBeats(double inBeats, const BeatInfo& inBeatInfo, std::int6
 	// Positions before the first bar are moved behind it by whole bars, which are taken off the bar number again.
 	const std::int64_t movedBars
 		= inBeats < 0 ? WrappingAdd(TruncateTo<std::int64_t>(-inBeats / inBeatInfo.iBeatsPerBar), 1) : 0;
-	double beats = inBeats + static_cast<double>(WrappingMultiply(movedBars, beatsPerBar));
-	const Ticks ticks = SplitTicks(beats, inBeatInfo.iTicksPerBeat);
+	const double beats = inBeats + static_cast<double>(WrappingMultiply(movedBars, beatsPerBar));
+	const double fraction = Fraction(beats);
 	const auto wholeBeats = TruncateTo<std::int64_t>(beats);
 	const std::int64_t bar = WrappingDivide(wholeBeats, beatsPerBar);
 	const std::int64_t beat = WrappingSubtract(wholeBeats, WrappingMultiply(bar, beatsPerBar));
-	return {WrappingSubtract(WrappingAdd(bar, inBase), movedBars), WrappingAdd(beat, inBase), Fraction(beats), ticks};
+	return {WrappingSubtract(WrappingAdd(bar, inBase), movedBars), WrappingAdd(beat, inBase), fraction,
+		SplitTicks(fraction, inBeatInfo.iTicksPerBeat)};
 }
 
 // The bar and, without a separator, the beat with decimals; every character behind the first "." becomes a "0".
@@ -133,7 +131,7 @@ void PutTicks(
 	ioText.PutNumber(inPosition.mTicks.mTicks, PaddedDigits(inTicksPerBeat));
 }
 
-void PutBarsAndBeats(
+void PutPosition(
 	PositionText& ioText, const MusicalPosition& inPosition, std::int32_t inTicksPerBeat, std::int32_t inStyle)
 {
 	if (inTicksPerBeat == kDecimalBeats)
@@ -144,16 +142,6 @@ void PutBarsAndBeats(
 		return;
 	ioText.Put('.');
 	ioText.PutNumber(inPosition.mTicks.mMilliTicks, 3);
-}
-
-void PutBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo)
-{
-	if (inSampleRate == 0)
-		return ioText.Put('0');
-	const double beats = static_cast<double>(inSamples) / (inSampleRate * 60.0 / inTempo) + 0.0005;
-	ioText.PutNumber(TruncateTo<std::int32_t>(beats));
-	ioText.Put('.');
-	ioText.PutNumber(TruncateTo<std::int32_t>(Fraction(beats) * 1'000), 3);
 }
 
 }   // namespace
@@ -171,8 +159,8 @@ std::int64_t ConvertBarsAndBeatsToSamples(
 		samples, TruncateTo<std::int64_t>(inSampleRate * inBeatInfo.dOffsetMilliseconds / 1'000.0 + 0.5));
 }
 
-bool ConvertSamplesToBarsAndBeats(UTF16String& outText, double inSamples, double inSampleRate,
-	const BeatInfo& inBeatInfo, bool inIsDuration, std::int32_t inStyle)
+bool PutBarsAndBeats(PositionText& ioText, double inSamples, double inSampleRate, const BeatInfo& inBeatInfo,
+	bool inIsDuration, std::int32_t inStyle)
 {
 	if (inBeatInfo.iBeatsPerBar == 0)
 	{
@@ -190,8 +178,24 @@ bool ConvertSamplesToBarsAndBeats(UTF16String& outText, double inSamples, double
 	const double nudge = 0.5 / inBeatInfo.iTicksPerBeat / 1'000.0;   // half a thousandth of a tick, against truncation
 	const double beats = BeatsPerMinute(inBeatInfo) * samples / 60.0 / inSampleRate + nudge;
 	const MusicalPosition position = SplitBeats(beats, inBeatInfo, inIsDuration ? 0 : 1);
-	SetText(outText, PutBarsAndBeats, position, inBeatInfo.iTicksPerBeat, inStyle);
+	PutPosition(ioText, position, inBeatInfo.iTicksPerBeat, inStyle);
 	return true;
+}
+
+bool ConvertSamplesToBarsAndBeats(UTF16String& outText, double inSamples, double inSampleRate,
+	const BeatInfo& inBeatInfo, bool inIsDuration, std::int32_t inStyle)
+{
+	return SetText(outText, PutBarsAndBeats, inSamples, inSampleRate, inBeatInfo, inIsDuration, inStyle);
+}
+
+void PutBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo) noexcept
+{
+	if (inSampleRate == 0)
+		return ioText.Put('0');
+	const double beats = static_cast<double>(inSamples) / (inSampleRate * 60.0 / inTempo) + 0.0005;
+	ioText.PutNumber(TruncateTo<std::int32_t>(beats));
+	ioText.Put('.');
+	ioText.PutNumber(TruncateTo<std::int32_t>(Fraction(beats) * 1'000), 3);
 }
 
 void ConvertSamplesToBeats(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo)

@@ -32,15 +32,21 @@ struct HMSF
 	friend constexpr bool operator==(const HMSF&, const HMSF&) noexcept = default;
 };
 
-/// Splits a frame count when every second has inNominal labels, at least one; up to 2^32 seconds. Hours wrap at 24.
-constexpr HMSF SplitFrames(std::uint64_t inFrames, std::uint64_t inNominal) noexcept
+/// Splits a frame count of which inSeconds whole seconds of inNominal labels are known; up to 2^32 seconds. Hours wrap at 24.
+constexpr HMSF SplitSeconds(std::uint64_t inFrames, std::uint64_t inSeconds, std::uint64_t inNominal) noexcept
 {
 	// Remainders are made from their quotients: compilers divide again for `%`.
-	const auto seconds = static_cast<std::uint32_t>(inFrames / inNominal);
+	const auto seconds = static_cast<std::uint32_t>(inSeconds);
 	const std::uint32_t minutes = seconds / 60;
 	const std::uint32_t hours = minutes / 60;
 	return {
 		hours < 24 ? hours : hours % 24, minutes - 60 * hours, seconds - 60 * minutes, inFrames - inNominal * seconds};
+}
+
+/// Splits a frame count when every second has inNominal labels, at least one.
+constexpr HMSF SplitFrames(std::uint64_t inFrames, std::uint64_t inNominal) noexcept
+{
+	return SplitSeconds(inFrames, inFrames / inNominal, inNominal);
 }
 
 /// Splits a frame count into drop-frame labels: puts the dropped ones back, then splits as usual. Hours wrap at 24.

@@ -2,6 +2,7 @@
 
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16String.h"
+#include "zonmediatypes/src/RateText.h"
 
 #include <array>
 #include <string>
@@ -48,6 +49,8 @@ double FramesPerSecondOf(FrameRate inRate)
 	return static_cast<double>(kTicksPerSecond) / static_cast<double>(inRate.GetTicksPerFrame());
 }
 
+}   // namespace
+
 // Two decimals tell all named rates apart but 23.976 and 24 fps, which people know by three.
 UTF16String RateText(FrameRate inRate)
 {
@@ -56,8 +59,6 @@ UTF16String RateText(FrameRate inRate)
 	return zoncore::utility::NumberToString(FramesPerSecondOf(inRate), kMinIntegerDigits,
 		inRate == kFrameRate_23976 ? 3 : 2, zoncore::utility::kNumberFlag_DropTrailingZeros, kMaxLength);
 }
-
-}   // namespace
 
 std::span<const FrameRate> AllFrameRates() noexcept
 {

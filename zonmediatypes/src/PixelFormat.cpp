@@ -163,8 +163,13 @@ public:
 
 	void Register(unsigned int inName, PixelFormatProperties inProperties)
 	{
+		// Memory is taken and given back without the lock, since that may take a lock of its own.
+		Registry added;
+		added.emplace(inName, inProperties);
 		const boost::lock_guard<boost::mutex> lock(mMutex);
-		mRegistry.insert_or_assign(inName, inProperties);
+		mRegistry.merge(added);
+		if (!added.empty())
+			mRegistry.find(inName)->second = inProperties;
 	}
 
 	PixelFormatProperties Lookup(unsigned int inName) const
@@ -175,8 +180,10 @@ public:
 	}
 
 private:
+	using Registry = zoncore::utility::SmallBlockAllocator::map<unsigned int, PixelFormatProperties>;
+
 	mutable boost::mutex mMutex;
-	zoncore::utility::SmallBlockAllocator::map<unsigned int, PixelFormatProperties> mRegistry;
+	Registry mRegistry;
 };
 
 // Made at load, or earlier for the static initialiser of a host that the library is linked into.

@@ -1,18 +1,20 @@
 #pragma once
 
 #include "zoncore/Debug.h"
+#include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/src/TextWriter.h"
 
 #include <atomic>
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
+#include <span>
+#include <type_traits>
 
 namespace zonmediatypes::utility
 {
 
-/// Holds the longest text of a sample position: four numbers of 20 characters and their separators.
-using PositionText = TextWriter<4 * (kLongestInteger + 1)>;
+using PositionText = TextWriter<kLongestPosition>;
 
 /// Digits of the largest number below inCount, as far as positions are padded: 1 to 4.
 constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept
@@ -26,13 +28,41 @@ constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept
 	return 4;
 }
 
-/// Replaces outText by what inPut writes of inArguments.
+/// Puts beats as ConvertSamplesToBeats describes them.
+void PutBeats(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, double inTempo) noexcept;
+
+/// Puts bars and beats as ConvertSamplesToBarsAndBeats describes them; false, after telling the host, for misuse.
+bool PutBarsAndBeats(PositionText& ioText, double inSamples, double inSampleRate, const BeatInfo& inBeatInfo,
+	bool inIsDuration, std::int32_t inStyle);
+
+/// Calls inPut with a text and inArguments; false where inPut says so.
 template <class Put, class... Arguments>
-void SetText(zoncore::UTF16String& outText, Put inPut, const Arguments&... inArguments)
+bool PutText(PositionText& ioText, Put inPut, const Arguments&... inArguments)
+{
+	if constexpr (std::is_void_v<decltype(inPut(ioText, inArguments...))>)
+		return inPut(ioText, inArguments...), true;
+	else
+		return inPut(ioText, inArguments...);
+}
+
+/// Replaces outText by what inPut writes of inArguments; false, and outText untouched, where inPut fails.
+template <class Put, class... Arguments>
+bool SetText(zoncore::UTF16String& outText, Put inPut, const Arguments&... inArguments)
 {
 	PositionText text;
-	inPut(text, inArguments...);
+	if (!PutText(text, inPut, inArguments...))
+		return false;
 	outText.assign(text.GetText());
+	return true;
+}
+
+/// The same into a caller's buffer, which is left alone where the text does not fit; the length of the text, 0 where inPut
+/// fails.
+template <class Char, class Put, class... Arguments>
+std::size_t WriteText(std::span<Char> outText, Put inPut, const Arguments&... inArguments)
+{
+	PositionText text;
+	return PutText(text, inPut, inArguments...) ? CopyText(text.GetText(), outText) : 0;
 }
 
 /// The part of inValue behind the point, with its sign; exact.

@@ -16,19 +16,28 @@ namespace zonmediatypes
 
 inline constexpr std::size_t kLongestInteger = 20;   // characters of a 64-bit integer, its sign included
 
-inline constexpr auto kDigitPairs = []
-{
-	std::array<std::array<zoncore::UTF16Char, 2>, 100> pairs{};
-	for (std::size_t number = 0; number < pairs.size(); ++number)
-		pairs[number]
-			= {static_cast<zoncore::UTF16Char>('0' + number / 10), static_cast<zoncore::UTF16Char>('0' + number % 10)};
-	return pairs;
-}();
-
 /// Writes two digits of a number below 100; the end of what was written.
-inline zoncore::UTF16Char* WriteTwoDigits(std::size_t inNumber, zoncore::UTF16Char* outText) noexcept
+template <class Char>
+Char* WriteTwoDigits(std::size_t inNumber, Char* outText) noexcept
 {
-	return std::copy_n(kDigitPairs[inNumber].data(), 2, outText);
+	static constexpr auto kPairs = []
+	{
+		std::array<std::array<Char, 2>, 100> pairs{};
+		for (std::size_t number = 0; number < pairs.size(); ++number)
+			pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
+		return pairs;
+	}();
+	return std::copy_n(kPairs[inNumber].data(), 2, outText);
+}
+
+/// Copies an ASCII text into a caller's buffer if it fits, and leaves the buffer alone if not; the length of the text.
+template <class Char>
+std::size_t CopyText(zoncore::UTF16StringView inAscii, std::span<Char> outText) noexcept
+{
+	if (inAscii.size() <= outText.size())
+		std::ranges::transform(
+			inAscii, outText.begin(), [](zoncore::UTF16Char inChar) { return static_cast<Char>(inChar); });
+	return inAscii.size();
 }
 
 /// A short text under construction: the characters that a 16-bit stream would write, without the stream and without

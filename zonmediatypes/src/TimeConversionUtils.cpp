@@ -170,11 +170,17 @@ TimecodeFields ParseTimeCodeString(UTF16StringView inText)
 }
 
 // The frame that labels stand for when none is dropped. 32-bit, wrapping.
+std::int32_t CountFrames(
+	std::int32_t inMinutes, std::int32_t inSeconds, std::int32_t inFrames, std::int32_t inFrameRate)
+{
+	const std::int32_t seconds = WrappingAdd(WrappingMultiply(inMinutes, 60), inSeconds);
+	return WrappingAdd(WrappingMultiply(seconds, inFrameRate), inFrames);
+}
+
 std::int32_t CountFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
 {
 	const std::int32_t minutes = WrappingAdd(WrappingMultiply(inFields.mHours, 60), inFields.mMinutes);
-	const std::int32_t seconds = WrappingAdd(WrappingMultiply(minutes, 60), inFields.mSeconds);
-	return WrappingAdd(WrappingMultiply(seconds, inFrameRate), inFields.mFrames);
+	return CountFrames(minutes, inFields.mSeconds, inFields.mFrames, inFrameRate);
 }
 
 // The frame that drop-frame labels stand for; labels that are dropped stand for the first one that is not. The
@@ -189,11 +195,11 @@ std::int32_t CountDropFrames(const TimecodeFields& inFields, std::int32_t inFram
 	const std::int32_t minutes = inFields.mMinutes % 10;
 
 	const bool isDropped = minutes != 0 && inFields.mSeconds == 0 && inFields.mFrames < droppedPerMinute;
-	const TimecodeFields rest{0, minutes, inFields.mSeconds, isDropped ? droppedPerMinute : inFields.mFrames, 0, 1};
+	const std::int32_t rest
+		= CountFrames(minutes, inFields.mSeconds, isDropped ? droppedPerMinute : inFields.mFrames, inFrameRate);
 	const std::int32_t blocks
 		= WrappingAdd(WrappingMultiply(inFields.mHours, framesPerHour), WrappingMultiply(tens, framesPerTenMinutes));
-	return WrappingAdd(
-		blocks, WrappingSubtract(CountFrames(rest, inFrameRate), WrappingMultiply(droppedPerMinute, minutes)));
+	return WrappingAdd(blocks, WrappingSubtract(rest, WrappingMultiply(droppedPerMinute, minutes)));
 }
 
 // The first sample at or behind a frame and a fraction of it. Wraps, but beyond the range of the integer formula the
@@ -257,12 +263,11 @@ FramePosition SamplesToFrames(
 	return {Magnitude(inSamples) * frameRate, sampleRate};
 }
 
-// Rates that positions can be divided by: frames per minute and per hour are 32-bit, wrapping, and not 0.
+// Rates that positions can be divided by: frames per hour, and with them those per minute, are 32-bit, wrapping, and not 0.
 bool CanDivideBy(std::int32_t inSampleRate, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
 {
-	const auto rate = static_cast<std::uint32_t>(inFrameRate);
 	const std::int32_t lowestRate = inStyle.mDropFrame ? kLowestDropFrameRate : 1;
-	return inSampleRate > 0 && inFrameRate >= lowestRate && rate * 60u != 0 && rate * 3'600u != 0;
+	return inSampleRate > 0 && inFrameRate >= lowestRate && static_cast<std::uint32_t>(inFrameRate) * 3'600 != 0;
 }
 
 // The frame count at 1000/1001 of a nominal rate, from the left to the right in doubles: one short on some frames.
@@ -387,9 +392,46 @@ void PutMilliseconds(PositionText& ioText, std::int64_t inSamples, std::int32_t 
 	ioText.PutNumber((tenths - Fraction(tenths)) / 10.0);
 }
 
-void PutSampleCount(PositionText& ioText, std::int64_t inSamples)
+// A position in any format; false, after telling the host, for misuse.
+bool PutPosition(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, const FormatRow& inFormat,
+	std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
 {
-	ioText.PutNumber(inSamples);
+	constexpr const char* kSignature
+		= "bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
+		  "TimecodeFormat, std::int32_t, const BeatInfo *, bool)";
+	switch (inFormat.mKind)
+	{
+	case TextKind::Decimal:
+		PutDecimal(ioText, inSamples, inSampleRate, false);
+		break;
+	case TextKind::Milliseconds:
+		PutMilliseconds(ioText, inSamples, inSampleRate);
+		break;
+	case TextKind::Samples:
+		ioText.PutNumber(inSamples);
+		break;
+	case TextKind::Timecode:
+		PutTimecode(ioText, inSamples, inSampleRate, inFrameRate, inFormat.mStyle);
+		break;
+	case TextKind::Beats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		PutBeats(ioText, inSamples, inSampleRate, inBeatInfo->dTempo);
+		break;
+	case TextKind::BarsAndBeats:
+		if (!inBeatInfo)
+		{
+			static constinit std::atomic<bool> sDisabled = false;
+			return ReportMissingBeatInfo(sDisabled, kSignature);
+		}
+		return PutBarsAndBeats(ioText, static_cast<double>(inSamples), inSampleRate, *inBeatInfo, inIsDuration, 2);
+	case TextKind::None:
+		break;
+	}
+	return true;
 }
 
 }   // namespace
@@ -460,44 +502,24 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate,
 	TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
 {
-	constexpr const char* kSignature
-		= "bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
-		  "TimecodeFormat, std::int32_t, const BeatInfo *, bool)";
 	const FormatRow& format = FindFormat(inFormat);
-	switch (format.mKind)
-	{
-	case TextKind::Decimal:
-		SetText(outText, PutDecimal, inSamples, inSampleRate, false);
-		break;
-	case TextKind::Milliseconds:
-		SetText(outText, PutMilliseconds, inSamples, inSampleRate);
-		break;
-	case TextKind::Samples:
-		SetText(outText, PutSampleCount, inSamples);
-		break;
-	case TextKind::Timecode:
-		SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, format.mStyle);
-		break;
-	case TextKind::Beats:
-		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
-		ConvertSamplesToBeats(outText, inSamples, inSampleRate, inBeatInfo->dTempo);
-		break;
-	case TextKind::BarsAndBeats:
-		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
-		return ConvertSamplesToBarsAndBeats(
-			outText, static_cast<double>(inSamples), inSampleRate, *inBeatInfo, inIsDuration, 2);
-	case TextKind::None:
-		break;
-	}
-	return true;
+	if (format.mKind == TextKind::None)
+		return true;
+	return SetText(outText, PutPosition, inSamples, inSampleRate, format, inFrameRate, inBeatInfo, inIsDuration);
+}
+
+std::size_t ConvertSamplesToTimecode(std::span<UTF16Char> outText, std::int64_t inSamples, std::int32_t inSampleRate,
+	TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
+{
+	return WriteText(
+		outText, PutPosition, inSamples, inSampleRate, FindFormat(inFormat), inFrameRate, inBeatInfo, inIsDuration);
+}
+
+std::size_t ConvertSamplesToTimecode(std::span<char> outText, std::int64_t inSamples, std::int32_t inSampleRate,
+	TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
+{
+	return WriteText(
+		outText, PutPosition, inSamples, inSampleRate, FindFormat(inFormat), inFrameRate, inBeatInfo, inIsDuration);
 }
 
 bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate,
@@ -514,8 +536,7 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 	}
 	const TimecodeStyle style{
 		inDropFrame, inNTSC, inFrameCountOnly, inOmitFrames, inSuppressLeadingZeros, inShowSubframes, inTotalMinutes};
-	SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, style);
-	return true;
+	return SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, style);
 }
 
 void ConvertSamplesToDecimalTimecode(
