@@ -32,14 +32,19 @@ std::vector<Named<AudioChannelLabel>> MakeLabelNames()
 	return names;
 }
 
+std::span<const Named<AudioChannelLabel>> LabelNames()
+{
+	static const std::vector<Named<AudioChannelLabel>> sNames = MakeLabelNames();
+	return sNames;
+}
+
 AudioChannelLayout ReadAbbreviations(std::string_view inText)
 {
-	static const std::vector<Named<AudioChannelLabel>> sLabels = MakeLabelNames();
 	AudioChannelLayout layout;
 	for (std::size_t begin = 0; begin < inText.size();)   // a comma may end the list, as in the library's own
 	{
 		const std::size_t end = std::min(inText.find(',', begin), inText.size());
-		layout.emplace_back(ValueNamed<AudioChannelLabel>(sLabels, "channel", inText.substr(begin, end - begin)));
+		layout.emplace_back(ValueNamed<AudioChannelLabel>(LabelNames(), "channel", inText.substr(begin, end - begin)));
 		begin = end + 1;
 	}
 	return layout;
@@ -56,10 +61,11 @@ std::span<const Named<AudioChannelLayout>> LayoutNames()
 AudioChannelLayout ReadLayout(std::string_view inText)
 {
 	const auto isMeant
-		= [inText](AudioChannelLabel inLabel) { return EditDistance(Abbreviation(inLabel), inText) == 0; };
-	if (std::ranges::any_of(AllAudioChannelLabels(), isMeant) || inText.find(',') != std::string_view::npos)
+		= [inText](const Named<AudioChannelLabel>& inNamed) { return IsSameName(inNamed.mName, inText); };
+	if (std::ranges::any_of(LabelNames(), isMeant) || inText.find(',') != std::string_view::npos)
 		return ReadAbbreviations(inText);
-	return ValueNamed<AudioChannelLayout>(LayoutNames(), "layout", inText);
+	return ValueNamed<AudioChannelLayout>(LayoutNames(), "layout", inText,
+		"; abbreviations (L,R,LFE) also serve, and \"zonmedia audio layouts\" lists the channels of each");
 }
 
 std::string Abbreviation(AudioChannelLabel inLabel)

@@ -1,5 +1,7 @@
 #include "zonmedia/Input.h"
 
+#include <algorithm>
+#include <charconv>
 #include <cstdint>
 #include <iostream>
 #include <string_view>
@@ -57,6 +59,20 @@ void ForEachValue(
 	}
 	if (showsProgress && number >= kLinesBetweenReports)
 		std::cerr << '\r' << number << " lines\n";
+}
+
+bool HasNumberAbove(std::string_view inText, std::uint64_t inMost)
+{
+	constexpr std::string_view kDigits = "0123456789";
+	for (std::size_t begin = inText.find_first_of(kDigits); begin != std::string_view::npos;)
+	{
+		const std::size_t end = std::min(inText.find_first_not_of(kDigits, begin), inText.size());
+		std::uint64_t number = 0;
+		if (std::from_chars(inText.data() + begin, inText.data() + end, number).ec != std::errc() || number > inMost)
+			return true;
+		begin = inText.find_first_of(kDigits, end);
+	}
+	return false;
 }
 
 }   // namespace zonmedia

@@ -5,8 +5,10 @@
 
 #include "zonmedia/Report.h"
 
+#include <cstdint>
 #include <functional>
 #include <string>
+#include <string_view>
 
 namespace zonmedia
 {
@@ -18,5 +20,8 @@ constexpr const char* kValueHelp = "The value; - reads one a line from standard 
 /// Shows on standard error how far a long list has come, when that is a terminal and the results go elsewhere.
 void ForEachValue(
 	const std::string& inValue, RecordList& ioRecords, const std::function<void(const std::string& inValue)>& inUse);
+
+/// Whether a run of digits in inText is a number above inMost.
+bool HasNumberAbove(std::string_view inText, std::uint64_t inMost);
 
 }   // namespace zonmedia

@@ -16,16 +16,30 @@ constexpr bool IsIgnored(char inChar)
 	return inChar == '_' || inChar == '-' || inChar == ' ';
 }
 
+constexpr char Lowered(char inChar)
+{
+	return inChar >= 'A' && inChar <= 'Z' ? static_cast<char>(inChar - 'A' + 'a') : inChar;
+}
+
 std::string Folded(std::string_view inText)
 {
 	std::string folded;
+	folded.reserve(inText.size());
 	for (const char character : inText)
 	{
 		if (!IsIgnored(character))
-			folded.push_back(
-				character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a') : character);
+			folded.push_back(Lowered(character));
 	}
 	return folded;
+}
+
+// "7.1" and "7_1" have the same letters and digits.
+std::string LettersAndDigits(std::string_view inText)
+{
+	std::string text = Folded(inText);
+	std::erase_if(
+		text, [](char inChar) { return !(inChar >= '0' && inChar <= '9') && !(inChar >= 'a' && inChar <= 'z'); });
+	return text;
 }
 
 }   // namespace
@@ -43,18 +57,40 @@ std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS)
 		{
 			const std::size_t replaced = diagonal + (left == rhs[i] ? 0 : 1);
 			diagonal = row[i + 1];
-			row[i + 1] = std::min({replaced, row[i] + 1, row[i + 1] + 1});
+			row[i + 1] = std::min(replaced, std::min(row[i], diagonal) + 1);
 		}
 	}
 	return row.back();
 }
 
+bool IsSameName(std::string_view inLHS, std::string_view inRHS)
+{
+	for (;; inLHS.remove_prefix(1), inRHS.remove_prefix(1))
+	{
+		for (std::string_view* const text : {&inLHS, &inRHS})
+		{
+			while (!text->empty() && IsIgnored(text->front()))
+				text->remove_prefix(1);
+		}
+		if (inLHS.empty() || inRHS.empty())
+			return inLHS.empty() && inRHS.empty();
+		if (Lowered(inLHS.front()) != Lowered(inRHS.front()))
+			return false;
+	}
+}
+
 std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames)
 {
-	std::vector<std::pair<std::size_t, std::string_view>> byDistance;
+	// A name that holds what was typed is nearer than one of the same length: "22.2" means VST22_2, not 51.
+	const std::string typed = LettersAndDigits(inText);
+	using Distance = std::pair<bool, std::size_t>;
+	std::vector<std::pair<Distance, std::string_view>> byDistance;
 	for (const std::string_view name : inNames)
-		byDistance.emplace_back(EditDistance(name, inText), name);
-	std::ranges::stable_sort(byDistance, {}, &std::pair<std::size_t, std::string_view>::first);
+	{
+		const bool isWithin = !typed.empty() && LettersAndDigits(name).find(typed) != std::string::npos;
+		byDistance.emplace_back(Distance{!isWithin, EditDistance(name, inText)}, name);
+	}
+	std::ranges::stable_sort(byDistance, {}, &std::pair<Distance, std::string_view>::first);
 	std::string sentence = "no " + std::string(inWhat) + " is named " + Quoted(inText) + "; the closest are";
 	for (std::size_t i = 0; i < std::min(kSuggestions, byDistance.size()); ++i)
 		sentence.append(i == 0 ? " " : ", ").append(byDistance[i].second);

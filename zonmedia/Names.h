@@ -28,25 +28,29 @@ struct Named
 /// are the same, as are "_", "-" and blanks.
 std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS);
 
-/// A sentence that refuses inText: what it is no name of, and the closest of inNames.
+/// Whether two names are one: but for case, "_", "-" and blanks. Compares without writing either anew.
+bool IsSameName(std::string_view inLHS, std::string_view inRHS);
+
+/// A sentence that refuses inText: what it is no name of, and the closest of inNames, those first that hold it.
 std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames);
 
 /// The value that inText names: exactly, or else but for case and "_". Throws UsageProblem with the closest names.
-/// inWhat is what is named: "display".
+/// inWhat is what is named: "display"; inElse ends the sentence with what else would serve.
 template <class T>
-const T& ValueNamed(std::span<const Named<T>> inAll, std::string_view inWhat, std::string_view inText)
+const T& ValueNamed(
+	std::span<const Named<T>> inAll, std::string_view inWhat, std::string_view inText, std::string_view inElse = {})
 {
 	const auto exact = std::ranges::find(inAll, inText, &Named<T>::mName);
 	if (exact != inAll.end())
 		return exact->mValue;
-	const auto isMeant = [inText](const Named<T>& inNamed) { return EditDistance(inNamed.mName, inText) == 0; };
+	const auto isMeant = [inText](const Named<T>& inNamed) { return IsSameName(inNamed.mName, inText); };
 	const auto meant = std::ranges::find_if(inAll, isMeant);
 	if (meant != inAll.end())
 		return meant->mValue;
 	std::vector<std::string_view> names;
 	for (const Named<T>& named : inAll)
 		names.emplace_back(named.mName);
-	throw UsageProblem(UnknownName(inWhat, inText, std::move(names)));
+	throw UsageProblem(UnknownName(inWhat, inText, std::move(names)).append(inElse));
 }
 
 /// The name of a value; empty when it has none.

@@ -85,31 +85,43 @@ std::string SamplesText(std::int64_t inSamples, TimecodeFormat inFormat, const C
 	return UTF16to8(text);
 }
 
+// The library reads a larger number as 0.
+std::uint64_t MostReadable(TimecodeFormat inFormat)
+{
+	constexpr std::uint64_t kMostSamples = std::numeric_limits<std::int64_t>::max();
+	constexpr std::uint64_t kMostOfField = std::numeric_limits<std::int32_t>::max();
+	return inFormat == kTimecodeFormat_Samples ? kMostSamples : kMostOfField;
+}
+
 std::int64_t ReadSamples(const std::string& inText, TimecodeFormat inFormat, const Clock& inClock)
 {
 	const auto isDigit = [](char inChar) { return inChar >= '0' && inChar <= '9'; };
+	const bool isTooLarge = HasNumberAbove(inText, MostReadable(inFormat));
 	std::int64_t samples = 0;
 	BeatInfo beats = inClock.mBeats;
-	const bool isRead = std::ranges::any_of(inText, isDigit)
+	const bool isRead = !isTooLarge && std::ranges::any_of(inText, isDigit)
 		&& ConvertTimecodeToSamples(samples, UTF8to16(inText), inFormat, inClock.mSampleRate, inClock.mFramesPerSecond,
 			&beats, inClock.mIsDuration);
 	if (!isRead)
 	{
 		// An hour, a minute, a second and a bit: every field of every format has something to show.
 		const std::int64_t example = std::int64_t{inClock.mSampleRate} * 3661 + inClock.mSampleRate / 2;
-		throw InputProblem(
-			"no digits in it; expected something like " + Quoted(SamplesText(example, inFormat, inClock)));
+		const std::string why = isTooLarge ? "too large a number in it" : "no digits in it";
+		throw InputProblem(why + "; expected something like " + Quoted(SamplesText(example, inFormat, inClock)));
 	}
 	return samples;
 }
 
 std::int32_t ReadSampleRate(const std::string& inText)
 {
-	const Fraction rate
-		= ReadRate(inText.find_first_not_of("0123456789") == std::string::npos ? inText + "Hz" : inText).mStated;
-	if (rate.mDenominator != 1 || rate.mNumerator > std::numeric_limits<std::int32_t>::max())
-		throw UsageProblem("the sample rate " + Quoted(inText) + " is no whole number of samples a second");
-	return static_cast<std::int32_t>(rate.mNumerator);
+	std::int32_t rate = 0;
+	const char* const end = inText.data() + inText.size();
+	const auto [behind, error] = std::from_chars(inText.data(), end, rate);
+	const bool endsRate = behind == end || IsSameName({behind, end}, "Hz");
+	if (error != std::errc() || !endsRate || rate <= 0)
+		throw UsageProblem(Quoted(inText) + " is no sample rate; expected 1 to "
+			+ std::to_string(std::numeric_limits<std::int32_t>::max()) + " samples a second, such as 48000");
+	return rate;
 }
 
 // "3/4": beats a bar, and the note that has the beat.
@@ -132,6 +144,10 @@ Clock ReadClock(const SamplesArguments& inArguments)
 	Clock clock{
 		ReadSampleRate(inArguments.mRate), inArguments.mFramesPerSecond, inArguments.mBeats, inArguments.mIsDuration};
 	std::tie(clock.mBeats.iBeatsPerBar, clock.mBeats.iBeatValue) = ReadMeter(inArguments.mMeter);
+	const std::int32_t ticks = clock.mBeats.iTicksPerBeat;
+	if (ticks < -1 || ticks == 0)
+		throw UsageProblem("--ticks " + std::to_string(ticks)
+			+ " is no count of ticks; expected 1 or more a beat, or -1 for decimal beats");
 	return clock;
 }
 

@@ -29,7 +29,7 @@ Status RunSheet(const SheetArguments& inArguments)
 		}
 		catch (const InputProblem& problem)
 		{
-			sheets.AddProblem(path, problem.what());
+			sheets.AddProblem(path.empty() ? Quoted(path) : path, problem.what());
 		}
 	}
 	return sheets.Finish();

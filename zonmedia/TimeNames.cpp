@@ -1,11 +1,13 @@
 #include "zonmedia/TimeNames.h"
 
 #include "zoncore/StringUtils.h"
+#include "zonmedia/Input.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/interop/TimeBase.h"
 
 #include <array>
 #include <charconv>
+#include <limits>
 #include <sstream>
 #include <utility>
 
@@ -114,6 +116,16 @@ std::string Expectation(FrameRate inRate, TimeForm inForm)
 		+ TimeText(example, inRate, inForm);
 }
 
+// The library reads a larger number as 32 bits hold, and the time of more frames than ticks can count wraps.
+std::uint64_t MostReadable(FrameRate inRate, TimeForm inForm)
+{
+	constexpr std::uint64_t kMostOfGroup = std::numeric_limits<std::uint32_t>::max();
+	constexpr std::int64_t kMostTicks = std::numeric_limits<std::int64_t>::max();
+	return inForm.mDisplay == kTimeDisplay_Frames
+		? std::min(kMostOfGroup, static_cast<std::uint64_t>(kMostTicks / inRate.GetTicksPerFrame()))
+		: kMostOfGroup;
+}
+
 }   // namespace
 
 std::optional<Rate> MakeRate(Fraction inFramesPerSecond)
@@ -184,6 +196,8 @@ std::string TimeText(TickTime inTime, FrameRate inRate, TimeForm inForm, Timecod
 
 TickTime ReadTime(std::string_view inText, FrameRate inRate, TimeForm inForm)
 {
+	if (const std::uint64_t most = MostReadable(inRate, inForm); inForm.mDisplay && HasNumberAbove(inText, most))
+		throw InputProblem("too large a number in it; expected " + std::to_string(most) + " at most");
 	if (inForm.mDisplay)
 	{
 		const TickTime time = TimecodeToTime(UTF8to16(inText), inRate, *inForm.mDisplay);
