@@ -3,9 +3,11 @@ set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME zonmediatypes)
 set(CPACK_PACKAGE_VENDOR zonmediatypes)
 set(CPACK_PACKAGE_CONTACT "zonmediatypes developers")
-set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "${zonmediatypes_DESCRIPTION}")
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "")   # each package says in a line of its own what it holds
 set(CPACK_VERBATIM_VARIABLES ON)
 set(CPACK_STRIP_FILES ON)
+set(CPACK_PRE_BUILD_SCRIPTS "${CMAKE_CURRENT_LIST_DIR}/ZonPackagePermissions.cmake")
+set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 
 set(CPACK_COMPONENTS_ALL runtime development)
 if(TARGET zonmedia)
@@ -20,7 +22,9 @@ set(CPACK_COMPONENT_COMPANION_DEPENDS runtime)
 # What the programs and libraries are linked with becomes their dependencies.
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
-set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS "$<TARGET_FILE_DIR:zoncore>" "$<TARGET_FILE_DIR:zonmediatypes>")
+set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS_POLICY ">=")   # a later release with this SOVERSION serves, too
+set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
+	"${zonmediatypes_BINARY_DIR}/zoncore" "${zonmediatypes_BINARY_DIR}/zonmediatypes")
 
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_NAME libzonmediatypes${zonmediatypes_VERSION_MAJOR})
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_SECTION libs)

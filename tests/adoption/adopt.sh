@@ -83,6 +83,32 @@ foreign_exports()
 		'^((typeinfo|typeinfo name|vtable|guard variable) for )?(zoncore::|zonmediatypes::|std::(ctype|__cxx11::numpunct|num_get|num_put)<unsigned short)'
 }
 
+# The Debian packages, made by somebody with a strict umask: they hold what is installed and nothing else, open to
+# everybody, and depend on each other and on what they are linked with. The companion runs from what was packed.
+check_packages()
+{
+	local folder=$scratch/packages package
+	rm -rf "$folder"
+	(umask 077 && cpack --config "$build/CPackConfig.cmake" -B "$folder")
+	for package in "$folder"/*.deb; do
+		dpkg-deb --extract "$package" "$folder/root"
+		dpkg-deb --contents "$package"
+	done >"$folder/contents"
+	diff <(cd "$scratch/installed-shared" && find . ! -type d | sort) <(cd "$folder/root/usr" && find . ! -type d | sort)
+	if grep -vE '^((drwxr-xr-x|-rw-r--r--|lrwxrwxrwx) root/root|-rwxr-xr-x root/root .* \./usr/bin/)' "$folder/contents"; then
+		echo "packed with the permissions above" >&2
+		exit 1
+	fi
+	depends "$folder"/libzonmediatypes[0-9]*.deb 'libstdc\+\+6 '
+	depends "$folder"/libzonmediatypes-dev_*.deb 'libzonmediatypes[0-9]+ \(= .*libboost-dev'
+	[ ! -e "$folder/root/usr/bin/zonmedia" ] || {
+		depends "$folder"/zonmedia_*.deb 'libzonmediatypes[0-9]+ \(= .*libavformat'
+		"$folder/root/usr/bin/zonmedia" --version
+	}
+}
+
+depends() { dpkg-deb --field "$1" Depends | grep -E "$2" || { echo "$1 does not depend on $2" >&2; exit 1; }; }
+
 case $way in
 	install)
 		cmake --install "$build" --prefix "$scratch/installed-shared"
@@ -108,6 +134,7 @@ case $way in
 		[ ! -e "$scratch/installed-shared/bin/zonmedia" ] || check_readme_sheet
 		;;
 	companion) check_companion ;;
+	packages) check_packages ;;
 	translations)
 		text=$("$scratch/installed-shared/bin/zonmedia" --language de time 1 --rate 25 --display frames)
 		[[ $text == *24-fps-Timecode* ]] || { echo "the installed companion speaks no German" >&2; exit 1; }
