@@ -1,9 +1,14 @@
 // Channel conversion and layout descriptions beside what libswresample and libavutil do for the same layouts.
 
+#include "Comparison.h"
+
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Descriptions.h"
 
-#include <benchmark/benchmark.h>
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <vector>
 
 extern "C"
 {
@@ -12,117 +17,172 @@ extern "C"
 #include <libswresample/swresample.h>
 }
 
-#include <array>
-
-namespace zonmediatypes
+namespace benchmarks
 {
 namespace
 {
 
-void Matrix(benchmark::State& ioState, AudioChannelLayout (*inSource)(), AudioChannelLayout (*inDestination)())
+using namespace zonmediatypes;   // NOLINT(google-build-using-namespace)
+
+using MakeLayout = AudioChannelLayout (*)();
+
+AVChannelLayout PeerLayout(std::uint64_t inSpeakers)
 {
-	const AudioChannelLayout source = inSource();
-	const AudioChannelLayout destination = inDestination();
-	ChannelConversionMatrix matrix;
-	for (auto _ : ioState)
-	{
-		ComputeChannelConversionMatrix(source, destination, matrix);
-		benchmark::DoNotOptimize(matrix.data());
-	}
+	AVChannelLayout layout{};
+	av_channel_layout_from_mask(&layout, inSpeakers);
+	return layout;
 }
 
-void SwresampleMatrix(benchmark::State& ioState, AVChannelLayout inSource, AVChannelLayout inDestination)
+// ---- Matrices --------------------------------------------------------------------------------------------------------
+
+Work Matrix(MakeLayout inSource, MakeLayout inDestination)
+{
+	return Repeat(
+		[source = inSource(), destination = inDestination(), matrix = ChannelConversionMatrix()]() mutable
+		{
+			ComputeChannelConversionMatrix(source, destination, matrix);
+			return matrix.data();
+		});
+}
+
+Work PeerMatrix(AVChannelLayout inSource, AVChannelLayout inDestination)
 {
 	av_log_set_level(AV_LOG_QUIET);   // a warning on every call is not what is measured
-	std::array<double, 64 * 64> matrix{};
-	for (auto _ : ioState)
-	{
-		constexpr double kMinus3dB = 0.70710678118654752;
-		swr_build_matrix2(&inSource, &inDestination, kMinus3dB, kMinus3dB, 0.0, 1.0, 1.0, matrix.data(), 64,
-			AV_MATRIX_ENCODING_NONE, nullptr);
-		benchmark::DoNotOptimize(matrix.data());
-	}
+	return Repeat(
+		[=, matrix = std::array<double, 64 * 64>()]() mutable
+		{
+			constexpr double kMinus3dB = 0.70710678118654752;
+			swr_build_matrix2(&inSource, &inDestination, kMinus3dB, kMinus3dB, 0.0, 1.0, 1.0, matrix.data(), 64,
+				AV_MATRIX_ENCODING_NONE, nullptr);
+			return matrix[0];
+		});
 }
-
-BENCHMARK_CAPTURE(Matrix, 5.1_to_stereo, CreateBroadcast51ChannelLayout, CreateStereoChannelLayout);
-BENCHMARK_CAPTURE(SwresampleMatrix, 5.1_to_stereo, AV_CHANNEL_LAYOUT_5POINT1_BACK, AV_CHANNEL_LAYOUT_STEREO);
-BENCHMARK_CAPTURE(Matrix, 7.1_to_5.1, Create7_1ItuChannelLayout, CreateBroadcast51ChannelLayout);
-BENCHMARK_CAPTURE(SwresampleMatrix, 7.1_to_5.1, AV_CHANNEL_LAYOUT_7POINT1, AV_CHANNEL_LAYOUT_5POINT1);
-BENCHMARK_CAPTURE(Matrix, 22.2_to_7.1, CreateVST22_2ChannelLayout, Create7_1ItuChannelLayout);
-BENCHMARK_CAPTURE(SwresampleMatrix, 22.2_to_7.1, AV_CHANNEL_LAYOUT_22POINT2, AV_CHANNEL_LAYOUT_7POINT1);
-
-// The peer has nothing to do this with.
-void IdentityMatrix(benchmark::State& ioState)
-{
-	ChannelConversionMatrix matrix;
-	for (auto _ : ioState)
-	{
-		CreateIdentityChannelConversionMatrix(8, 8, matrix);
-		benchmark::DoNotOptimize(matrix.data());
-	}
-}
-BENCHMARK(IdentityMatrix)->Name("IdentityMatrix/7.1");
-
-void Remap(benchmark::State& ioState)
-{
-	const AudioChannelLayout source = CreateBroadcast51ChannelLayout();
-	const AudioChannelLayout destination = CreateLegacy51ChannelLayout();
-	ChannelOrdering ordering;
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(RemapChannelOrdering(source, destination, ordering));
-		benchmark::DoNotOptimize(ordering.data());
-	}
-}
-BENCHMARK(Remap)->Name("Remap/5.1");
 
 // ---- Descriptions ----------------------------------------------------------------------------------------------------
 
-void Description(benchmark::State& ioState, AudioChannelLayout (*inLayout)())
+Work Description(MakeLayout inLayout)
 {
-	const AudioChannelLayout layout = inLayout();
-	for (auto _ : ioState)
-		benchmark::DoNotOptimize(AudioChannelLayoutDescription(layout));
+	return Repeat([layout = inLayout()] { return AudioChannelLayoutDescription(layout); });
 }
 
-void AvutilDescription(benchmark::State& ioState, AVChannelLayout inLayout)
+Work PeerDescription(AVChannelLayout inLayout)
 {
-	std::array<char, 256> text{};
-	for (auto _ : ioState)
-	{
-		av_channel_layout_describe(&inLayout, text.data(), text.size());
-		benchmark::DoNotOptimize(text.data());
-	}
+	return Repeat(
+		[inLayout, text = std::array<char, 256>()]() mutable
+		{
+			av_channel_layout_describe(&inLayout, text.data(), text.size());
+			return text[0];
+		});
 }
 
 // An order of the peer's own making, for which it has no name.
 template <AVChannel... inChannels>
-void AvutilDescriptionOf(benchmark::State& ioState)
+Work PeerDescriptionOf()
 {
-	std::array<AVChannelCustom, sizeof...(inChannels)> channels{AVChannelCustom{inChannels, {}, nullptr}...};
+	static std::array<AVChannelCustom, sizeof...(inChannels)> sChannels{AVChannelCustom{inChannels, {}, nullptr}...};
 	AVChannelLayout layout{};
 	layout.order = AV_CHANNEL_ORDER_CUSTOM;
 	layout.nb_channels = sizeof...(inChannels);
-	layout.u.map = channels.data();
-	AvutilDescription(ioState, layout);
+	layout.u.map = sChannels.data();
+	return PeerDescription(layout);
 }
 
-BENCHMARK_CAPTURE(Description, stereo, CreateStereoChannelLayout);
-BENCHMARK_CAPTURE(AvutilDescription, stereo, AV_CHANNEL_LAYOUT_STEREO);
-BENCHMARK_CAPTURE(Description, 5.1, CreateBroadcast51ChannelLayout);
-BENCHMARK_CAPTURE(AvutilDescription, 5.1, AV_CHANNEL_LAYOUT_5POINT1_BACK);
-BENCHMARK_CAPTURE(Description, 7.1, Create7_1ItuChannelLayout);
-BENCHMARK_CAPTURE(AvutilDescription, 7.1, AV_CHANNEL_LAYOUT_7POINT1);
-BENCHMARK_CAPTURE(Description, 22.2, CreateVST22_2ChannelLayout);
-BENCHMARK_CAPTURE(AvutilDescription, 22.2, AV_CHANNEL_LAYOUT_22POINT2);
+// ---- Growth ----------------------------------------------------------------------------------------------------------
 
-BENCHMARK_CAPTURE(Description, L_R_Ls_Rs_C_LFE, CreateLegacy51ChannelLayout);
-BENCHMARK(AvutilDescriptionOf<AV_CHAN_FRONT_LEFT, AV_CHAN_FRONT_RIGHT, AV_CHAN_BACK_LEFT, AV_CHAN_BACK_RIGHT,
-			  AV_CHAN_FRONT_CENTER, AV_CHAN_LOW_FREQUENCY>)
-	->Name("AvutilDescription/L_R_Ls_Rs_C_LFE");
-BENCHMARK_CAPTURE(Description, C_L_R, Create_C_L_R_ChannelLayout);
-BENCHMARK(AvutilDescriptionOf<AV_CHAN_FRONT_CENTER, AV_CHAN_FRONT_LEFT, AV_CHAN_FRONT_RIGHT>)
-	->Name("AvutilDescription/C_L_R");
+// Labels in an order that is none of the catalogue's.
+AudioChannelLayout LayoutOf(std::size_t inChannels)
+{
+	const std::span<const AudioChannelLabel> labels = AllAudioChannelLabels();
+	AudioChannelLayout layout;
+	for (std::size_t i = 0; i < inChannels; ++i)
+		layout.emplace_back(labels[i * 7 % labels.size()]);
+	return layout;
+}
+
+template <class Call>
+Work PerChannel(std::size_t inChannels, Call inCall)
+{
+	return [inChannels, inCall](benchmark::State& ioState)
+	{
+		const AudioChannelLayout layout = LayoutOf(inChannels);
+		Call call = inCall;
+		for (auto _ : ioState)
+			benchmark::DoNotOptimize(call(layout));
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inChannels));
+	};
+}
+
+constexpr auto sChannelCounts = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000, 100'000});
+
+[[maybe_unused]] const bool sAdded = []
+{
+	constexpr const char* kArea = "Audio";
+	Compare(kArea, "matrix, 5.1 to stereo", Matrix(CreateBroadcast51ChannelLayout, CreateStereoChannelLayout),
+		{{"libswresample", PeerMatrix(PeerLayout(AV_CH_LAYOUT_5POINT1_BACK), PeerLayout(AV_CH_LAYOUT_STEREO))}});
+	Compare(kArea, "matrix, 7.1 to 5.1", Matrix(Create7_1ItuChannelLayout, CreateBroadcast51ChannelLayout),
+		{{"libswresample", PeerMatrix(PeerLayout(AV_CH_LAYOUT_7POINT1), PeerLayout(AV_CH_LAYOUT_5POINT1))}});
+	Compare(kArea, "matrix, 22.2 to 7.1 (9 of 24 channels there)",
+		Matrix(CreateVST22_2ChannelLayout, Create7_1ItuChannelLayout),
+		{{"libswresample", PeerMatrix(PeerLayout(AV_CH_LAYOUT_22POINT2), PeerLayout(AV_CH_LAYOUT_7POINT1))}});
+	Compare(kArea, "identity matrix, 8 by 8",
+		Repeat(
+			[matrix = ChannelConversionMatrix()]() mutable
+			{
+				CreateIdentityChannelConversionMatrix(8, 8, matrix);
+				return matrix.data();
+			}));
+	Compare(kArea, "reordering, 5.1",
+		Repeat(
+			[source = CreateBroadcast51ChannelLayout(), destination = CreateLegacy51ChannelLayout(),
+				ordering = ChannelOrdering()]() mutable
+			{
+				RemapChannelOrdering(source, destination, ordering);
+				return ordering.data();
+			}));
+	Compare(kArea, "description, stereo", Description(CreateStereoChannelLayout),
+		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_STEREO))}});
+	Compare(kArea, "description, 5.1 (a fixed name there)", Description(CreateBroadcast51ChannelLayout),
+		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_5POINT1_BACK))}});
+	Compare(kArea, "description, 7.1 (a fixed name there)", Description(Create7_1ItuChannelLayout),
+		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_7POINT1))}});
+	Compare(kArea, "description, 22.2 (a fixed name there)", Description(CreateVST22_2ChannelLayout),
+		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_22POINT2))}});
+	Compare(kArea, "description, L R Ls Rs C LFE (no name there)", Description(CreateLegacy51ChannelLayout),
+		{{"libavutil",
+			PeerDescriptionOf<AV_CHAN_FRONT_LEFT, AV_CHAN_FRONT_RIGHT, AV_CHAN_BACK_LEFT, AV_CHAN_BACK_RIGHT,
+				AV_CHAN_FRONT_CENTER, AV_CHAN_LOW_FREQUENCY>()}});
+	Compare(kArea, "description, C L R (no name there)", Description(Create_C_L_R_ChannelLayout),
+		{{"libavutil", PeerDescriptionOf<AV_CHAN_FRONT_CENTER, AV_CHAN_FRONT_LEFT, AV_CHAN_FRONT_RIGHT>()}});
+
+	Grow("matrix of so many channels to stereo", sChannelCounts,
+		[](std::size_t inChannels)
+		{
+			return PerChannel(inChannels,
+				[destination = CreateStereoChannelLayout(), matrix = ChannelConversionMatrix()](
+					const AudioChannelLayout& inLayout) mutable
+				{
+					ComputeChannelConversionMatrix(inLayout, destination, matrix);
+					return matrix.data();
+				});
+		});
+	Grow("ordering of so many channels reversed", sChannelCounts,
+		[](std::size_t inChannels)
+		{
+			return PerChannel(inChannels,
+				[ordering = ChannelOrdering()](const AudioChannelLayout& inLayout) mutable
+				{
+					RemapChannelOrdering(inLayout, AudioChannelLayout(inLayout.rbegin(), inLayout.rend()), ordering);
+					return ordering.data();
+				});
+		});
+	Grow("description of so many channels without a translation", sChannelCounts,
+		[](std::size_t inChannels)
+		{
+			return PerChannel(inChannels,
+				[](const AudioChannelLayout& inLayout) { return AudioChannelLayoutDescriptionUnlocalized(inLayout); });
+		});
+	return true;
+}();
 
 }   // namespace
-}   // namespace zonmediatypes
+}   // namespace benchmarks

@@ -1,21 +1,22 @@
+// The core layer beside the standard library: each pair of functions does the same work on the same data.
+
+#include "Comparison.h"
+
 #include "zoncore/Localizer.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/SmallBlockAllocator.h"
 #include "zoncore/StringUtils.h"
 
-#include <benchmark/benchmark.h>
-
 #include <array>
 #include <cstddef>
-#include <cstdint>
 #include <cstdio>
 #include <cstdlib>
 #include <new>
 #include <string>
 #include <vector>
 
-// The core layer beside the standard library: each pair of functions does the same work on the same data.
-
+namespace benchmarks
+{
 namespace
 {
 
@@ -37,134 +38,90 @@ struct SystemMemory
 };
 
 template <class Memory>
-void OneBlock(benchmark::State& ioState)
+Work OneBlock(std::size_t inSize)
 {
-	const auto size = static_cast<std::size_t>(ioState.range(0));
-	for (auto _ : ioState)
+	return [inSize](benchmark::State& ioState)
 	{
-		void* const block = Memory::Allocate(size);
-		benchmark::DoNotOptimize(block);
-		Memory::Dispose(block, size);
-	}
+		for (auto _ : ioState)
+		{
+			void* const block = Memory::Allocate(inSize);
+			benchmark::DoNotOptimize(block);
+			Memory::Dispose(block, inSize);
+		}
+	};
 }
-BENCHMARK(OneBlock<PoolMemory>)->Arg(24)->Arg(200);
-BENCHMARK(OneBlock<SystemMemory>)->Arg(24)->Arg(200);
 
 template <class Memory>
-void ManyBlocks(benchmark::State& ioState)
+Work ManyBlocks(std::size_t inSize)
 {
-	std::vector<void*> blocks(1'000);
-	for (auto _ : ioState)
+	return [inSize](benchmark::State& ioState)
 	{
-		for (void*& block : blocks)
-			block = Memory::Allocate(40);
-		for (void* const block : blocks)
-			Memory::Dispose(block, 40);
-	}
-	ioState.SetItemsProcessed(ioState.iterations() * 1'000);
+		std::vector<void*> blocks(1'000);
+		for (auto _ : ioState)
+		{
+			for (void*& block : blocks)
+				block = Memory::Allocate(inSize);
+			benchmark::DoNotOptimize(blocks.data());
+			for (void* const block : blocks)
+				Memory::Dispose(block, inSize);
+		}
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(blocks.size()));
+	};
 }
-BENCHMARK(ManyBlocks<PoolMemory>)->Threads(1)->Threads(2);
-BENCHMARK(ManyBlocks<SystemMemory>)->Threads(1)->Threads(2);
 
-// ---- Text ------------------------------------------------------------------------------------------------------------
-
-void LookupWithoutTranslator(benchmark::State& ioState)
+[[maybe_unused]] const bool sAdded = []
 {
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(
-			config::Localizer::Get().Lookup("$$$/zonmediatypes/TimeDisplay/2997DF=29.97 fps Drop-Frame"));
-	}
-}
-BENCHMARK(LookupWithoutTranslator);
+	constexpr const char* kArea = "Core";
+	constexpr const char* kNew = "operator new";
+	for (const std::size_t size : {24U, 200U})
+		Compare(kArea, "a block of " + std::to_string(size) + " bytes, served and taken back",
+			OneBlock<PoolMemory>(size), {{kNew, OneBlock<SystemMemory>(size)}});
+	Compare(
+		kArea, "1,000 blocks of 40 bytes, a block", ManyBlocks<PoolMemory>(40), {{kNew, ManyBlocks<SystemMemory>(40)}});
 
-void FillTemplate(benchmark::State& ioState)
-{
-	const std::array texts{AsciiToUTF16("1920"), AsciiToUTF16("1080"), AsciiToUTF16("1.0")};
-	for (auto _ : ioState)
+	Compare(kArea, "look-up of a text without a translator",
+		Repeat(
+			[]
+			{
+				return config::Localizer::Get().Lookup(
+					"$$$/zonmediatypes/TimeDisplay/2997DropTimecode=29.97 fps Drop-Frame Timecode");
+			}));
+	Compare(kArea, "template with three texts filled in",
+		Repeat([texts = std::array{AsciiToUTF16("1920"), AsciiToUTF16("1080"), AsciiToUTF16("1.0")}]() -> UTF16String
+			{ return ZString("$$$/zonmediatypes/VideoFrameSizeFormatPAR=@0w @1h (@2)", texts); }));
+	for (const auto& [name, character] :
+		{std::pair("1,000 ASCII characters", "x"), std::pair("1,000 x \"€\"", "\u20AC")})
 	{
-		benchmark::DoNotOptimize(ZString("$$$/zonmediatypes/VideoFrameSizeFormatPAR=@0w @1h (@2)", texts));
+		std::string text;
+		for (int i = 0; i < 1'000; ++i)
+			text += character;
+		Compare(kArea, std::string("UTF-8 to UTF-16, ") + name, Repeat([text] { return UTF8to16(text); }));
+		Compare(
+			kArea, std::string("UTF-16 to UTF-8, ") + name, Repeat([text = UTF8to16(text)] { return UTF16to8(text); }));
 	}
-}
-BENCHMARK(FillTemplate);
 
-void FromUTF8(benchmark::State& ioState)
-{
-	const std::string text = ioState.range(0) == 0
-		? std::string(1'000, 'x')
-		: std::string("\xC3\xA9\xE2\x82\xAC\xF0\x9F\x8E\xAC latin ") + std::string(500, 'x') + "\xE2\x82\xAC";
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(UTF8to16(text));
-	}
-	ioState.SetBytesProcessed(ioState.iterations() * static_cast<std::int64_t>(text.size()));
-}
-BENCHMARK(FromUTF8)->Arg(0)->Arg(1);
-
-void ToUTF8(benchmark::State& ioState)
-{
-	const UTF16String text(1'000, ioState.range(0) == 0 ? UTF16Char{'x'} : UTF16Char{0x20AC});
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(UTF16to8(text));
-	}
-	ioState.SetBytesProcessed(ioState.iterations() * static_cast<std::int64_t>(2 * text.size()));
-}
-BENCHMARK(ToUTF8)->Arg(0)->Arg(1);
-
-// ---- Numbers ---------------------------------------------------------------------------------------------------------
-
-void WriteDouble(benchmark::State& ioState)
-{
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(NumberToString(30'000 / 1'001.0, 1, 4, kNumberFlag_DropTrailingZeros, 31));
-	}
-}
-BENCHMARK(WriteDouble);
-
-void WriteDoubleSnprintf(benchmark::State& ioState)
-{
-	for (auto _ : ioState)
-	{
-		std::array<char, 40> text;
-		std::snprintf(text.data(), text.size(), "%.4f", 30'000 / 1'001.0);
-		benchmark::DoNotOptimize(text);
-	}
-}
-BENCHMARK(WriteDoubleSnprintf);
-
-void ReadDouble(benchmark::State& ioState)
-{
-	const UTF16String text = AsciiToUTF16("29.97002997");
-	for (auto _ : ioState)
-	{
-		double value = 0;
-		benchmark::DoNotOptimize(StringToNumber(text, value, 0));
-		benchmark::DoNotOptimize(value);
-	}
-}
-BENCHMARK(ReadDouble);
-
-void ReadDoubleStrtod(benchmark::State& ioState)
-{
-	const std::string text = "29.97002997";
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(std::strtod(text.c_str(), nullptr));
-	}
-}
-BENCHMARK(ReadDoubleStrtod);
-
-void ApproximateFraction(benchmark::State& ioState)
-{
-	double value = 29.97;
-	for (auto _ : ioState)
-	{
-		benchmark::DoNotOptimize(value);
-		benchmark::DoNotOptimize(RationalApproximation(value));
-	}
-}
-BENCHMARK(ApproximateFraction);
+	Compare(kArea, "a double as text",
+		Repeat([value = 30'000 / 1'001.0] { return NumberToString(value, 1, 4, kNumberFlag_DropTrailingZeros, 31); }),
+		{{"snprintf",
+			Repeat([value = 30'000 / 1'001.0, text = std::array<char, 40>()]() mutable
+				{ return std::snprintf(text.data(), text.size(), "%.4f", value); })}});
+	Compare(kArea, "a double from text",
+		Repeat(
+			[text = AsciiToUTF16("29.97002997")]
+			{
+				double value = 0;
+				StringToNumber(text, value, 0);
+				return value;
+			}),
+		{{"strtod", Repeat([text = std::string("29.97002997")] { return std::strtod(text.c_str(), nullptr); })}});
+	Compare(kArea, "a double as the closest fraction",
+		ForEach(
+			[] {
+				return std::vector{29.97, 23.976, 59.94, 0.9091, 1.0667};
+			},
+			[](double inValue) { return RationalApproximation(inValue); }));
+	return true;
+}();
 
 }   // namespace
+}   // namespace benchmarks

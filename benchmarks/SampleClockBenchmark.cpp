@@ -1,45 +1,96 @@
 // Sample positions to text and back, beside libavutil's timecode functions on the same frames.
 
-#include "zoncore/StringUtils.h"
+#include "Comparison.h"
+
 #include "zonmediatypes/TimeConversionUtils.h"
+
+#include <array>
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
 
 extern "C"
 {
 #include <libavutil/timecode.h>
 }
 
-#include <array>
-#include <benchmark/benchmark.h>
-#include <string>
-#include <vector>
-
+namespace benchmarks
+{
 namespace
 {
 
-using namespace zonmediatypes::utility;
+using namespace zonmediatypes::utility;   // NOLINT(google-build-using-namespace)
+using zoncore::UTF16Char;
 using zoncore::UTF16String;
 
 constexpr std::int32_t kSampleRate = 48'000;
 constexpr std::int32_t kFrameRate = 30;
 constexpr std::int32_t kFramesPerDay = 24 * 107'892;
-constexpr std::size_t kPositions = 1'024;   // a power of two
+constexpr std::size_t kPositions = 1'024;
 
 // Frames all over a day, in an order that no branch predictor knows.
-std::array<std::int32_t, kPositions> Frames()
+std::vector<std::int32_t> Frames()
 {
-	std::array<std::int32_t, kPositions> frames{};
+	std::vector<std::int32_t> frames;
 	std::uint32_t frame = 1;
-	for (std::int32_t& value : frames)
+	for (std::size_t i = 0; i < kPositions; ++i)
 	{
 		frame = frame * 1'664'525 + 1'013'904'223;
-		value = static_cast<std::int32_t>(frame % kFramesPerDay);
+		frames.push_back(static_cast<std::int32_t>(frame % kFramesPerDay));
 	}
 	return frames;
 }
 
-std::int64_t FirstSample(std::int32_t inFrame)
+std::vector<std::int64_t> Samples()
 {
-	return (std::int64_t{inFrame} * kSampleRate * 1'001 + kFrameRate * 1'000 - 1) / (kFrameRate * 1'000);
+	std::vector<std::int64_t> samples;
+	for (const std::int32_t frame : Frames())
+		samples.push_back((std::int64_t{frame} * kSampleRate * 1'001 + kFrameRate * 1'000 - 1) / (kFrameRate * 1'000));
+	return samples;
+}
+
+Work TextOut(TimecodeFormat inFormat)
+{
+	return ForEach(Samples,
+		[inFormat, text = UTF16String()](std::int64_t inSamples) mutable
+		{
+			const BeatInfo beats;
+			ConvertSamplesToTimecode(text, inSamples, kSampleRate, inFormat, kFrameRate, &beats, false);
+			return text.data();
+		});
+}
+
+Work TextIntoBuffer(TimecodeFormat inFormat)
+{
+	return ForEach(Samples,
+		[inFormat, text = std::array<UTF16Char, kLongestPosition>()](std::int64_t inSamples) mutable
+		{
+			const BeatInfo beats;
+			return ConvertSamplesToTimecode(
+				std::span(text), inSamples, kSampleRate, inFormat, kFrameRate, &beats, false);
+		});
+}
+
+Work TextIn(TimecodeFormat inFormat)
+{
+	return ForEach(
+		[inFormat]
+		{
+			std::vector<UTF16String> texts;
+			BeatInfo beats;
+			for (const std::int64_t samples : Samples())
+				ConvertSamplesToTimecode(
+					texts.emplace_back(), samples, kSampleRate, inFormat, kFrameRate, &beats, false);
+			return texts;
+		},
+		[inFormat](const UTF16String& inText)
+		{
+			BeatInfo beats;
+			std::int64_t samples = 0;
+			ConvertTimecodeToSamples(samples, inText, inFormat, kSampleRate, kFrameRate, &beats, false);
+			return samples;
+		});
 }
 
 AVTimecode PeerTimecode(int inFlags)
@@ -49,74 +100,60 @@ AVTimecode PeerTimecode(int inFlags)
 	return timecode;
 }
 
-void SamplesToText(benchmark::State& ioState, TimecodeFormat inFormat)
+Work PeerTextOut(int inFlags)
 {
-	const auto frames = Frames();
-	std::vector<std::int64_t> samples;
-	for (const std::int32_t frame : frames)
-		samples.push_back(FirstSample(frame));
-	const BeatInfo beats;
-	UTF16String text;
-	std::size_t i = 0;
-	for (auto _ : ioState)
-	{
-		ConvertSamplesToTimecode(text, samples[i++ % kPositions], kSampleRate, inFormat, kFrameRate, &beats, false);
-		benchmark::DoNotOptimize(text.data());
-	}
+	return ForEach(Frames,
+		[timecode = PeerTimecode(inFlags), text = std::array<char, AV_TIMECODE_STR_SIZE>()](int inFrame) mutable
+		{ return av_timecode_make_string(&timecode, text.data(), inFrame); });
 }
-BENCHMARK_CAPTURE(SamplesToText, DropFrame, kTimecodeFormat_TimecodeDropFrame);
-BENCHMARK_CAPTURE(SamplesToText, NonDrop, kTimecodeFormat_TimecodeNTSC);
-BENCHMARK_CAPTURE(SamplesToText, BarsAndBeats, kTimecodeFormat_BarsAndBeats);
 
-void FramesToTextByFFmpeg(benchmark::State& ioState, int inFlags)
+Work PeerTextIn(int inFlags)
 {
-	const auto frames = Frames();
-	const AVTimecode timecode = PeerTimecode(inFlags);
-	char text[AV_TIMECODE_STR_SIZE];
-	std::size_t i = 0;
-	for (auto _ : ioState)
-		benchmark::DoNotOptimize(av_timecode_make_string(&timecode, text, frames[i++ % kPositions]));
+	return ForEach(
+		[inFlags]
+		{
+			const AVTimecode writer = PeerTimecode(inFlags);
+			std::vector<std::string> texts;
+			for (const std::int32_t frame : Frames())
+			{
+				char text[AV_TIMECODE_STR_SIZE];
+				texts.emplace_back(av_timecode_make_string(&writer, text, frame));
+			}
+			return texts;
+		},
+		[](const std::string& inText)
+		{
+			AVTimecode timecode;
+			av_timecode_init_from_string(&timecode, {30'000, 1'001}, inText.c_str(), nullptr);
+			return timecode.start;
+		});
 }
-BENCHMARK_CAPTURE(FramesToTextByFFmpeg, DropFrame, AV_TIMECODE_FLAG_DROPFRAME);
-BENCHMARK_CAPTURE(FramesToTextByFFmpeg, NonDrop, 0);
 
-void TextToSamples(benchmark::State& ioState, TimecodeFormat inFormat)
+[[maybe_unused]] const bool sAdded = []
 {
-	BeatInfo beats;
-	std::vector<UTF16String> texts(kPositions);
-	const auto frames = Frames();
-	for (std::size_t i = 0; i < kPositions; ++i)
-		ConvertSamplesToTimecode(texts[i], FirstSample(frames[i]), kSampleRate, inFormat, kFrameRate, &beats, false);
-	std::size_t i = 0;
-	for (auto _ : ioState)
+	constexpr const char* kArea = "Sample clock";
+	struct Case
 	{
-		std::int64_t samples = 0;
-		ConvertTimecodeToSamples(samples, texts[i++ % kPositions], inFormat, kSampleRate, kFrameRate, &beats, false);
-		benchmark::DoNotOptimize(samples);
-	}
-}
-BENCHMARK_CAPTURE(TextToSamples, DropFrame, kTimecodeFormat_TimecodeDropFrame);
-BENCHMARK_CAPTURE(TextToSamples, NonDrop, kTimecodeFormat_TimecodeNTSC);
-BENCHMARK_CAPTURE(TextToSamples, BarsAndBeats, kTimecodeFormat_BarsAndBeats);
-
-void TextToFramesByFFmpeg(benchmark::State& ioState, int inFlags)
-{
-	const AVTimecode writer = PeerTimecode(inFlags);
-	std::vector<std::string> texts;
-	for (const std::int32_t frame : Frames())
+		const char* mName;
+		TimecodeFormat mFormat;
+		int mPeerFlags;
+	};
+	constexpr auto kCases = std::to_array<Case>({
+		{"drop-frame", kTimecodeFormat_TimecodeDropFrame, AV_TIMECODE_FLAG_DROPFRAME},
+		{"non-drop", kTimecodeFormat_TimecodeNTSC, 0},
+	});
+	for (const Case& row : kCases)
 	{
-		char text[AV_TIMECODE_STR_SIZE];
-		texts.emplace_back(av_timecode_make_string(&writer, text, frame));
+		const std::vector<Peer> out{{"libavutil", PeerTextOut(row.mPeerFlags)}};
+		Compare(kArea, std::string(row.mName) + " text into a buffer", TextIntoBuffer(row.mFormat), out);
+		Compare(kArea, std::string(row.mName) + " text as a string", TextOut(row.mFormat), out);
+		Compare(kArea, std::string(row.mName) + " text in", TextIn(row.mFormat),
+			{{"libavutil", PeerTextIn(row.mPeerFlags)}});
 	}
-	std::size_t i = 0;
-	for (auto _ : ioState)
-	{
-		AVTimecode timecode;
-		av_timecode_init_from_string(&timecode, {30'000, 1'001}, texts[i++ % kPositions].c_str(), nullptr);
-		benchmark::DoNotOptimize(timecode.start);
-	}
-}
-BENCHMARK_CAPTURE(TextToFramesByFFmpeg, DropFrame, AV_TIMECODE_FLAG_DROPFRAME);
-BENCHMARK_CAPTURE(TextToFramesByFFmpeg, NonDrop, 0);
+	Compare(kArea, "bars and beats", TextOut(kTimecodeFormat_BarsAndBeats));
+	Compare(kArea, "bars and beats in", TextIn(kTimecodeFormat_BarsAndBeats));
+	return true;
+}();
 
 }   // namespace
+}   // namespace benchmarks

@@ -1,13 +1,14 @@
 // Timecode of 100,000 frames spread over a day, beside libavutil's.
 
+#include "Comparison.h"
+
+#include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/Timecode.h"
 
-#include "zoncore/StringUtils.h"
-
 #include <array>
-#include <benchmark/benchmark.h>
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <vector>
 
 extern "C"
@@ -15,10 +16,12 @@ extern "C"
 #include <libavutil/timecode.h>
 }
 
-namespace zonmediatypes
+namespace benchmarks
 {
 namespace
 {
+
+using namespace zonmediatypes;   // NOLINT(google-build-using-namespace)
 
 constexpr int kFrames = 100'000;
 
@@ -28,13 +31,16 @@ struct Case
 	TimeDisplay mDisplay;
 	FrameRate mRate;
 	AVRational mAVRate;
-	unsigned mAVFlags;
+	int mAVFlags;
+	double mWantedIntoBuffer;   // times as fast as the peer's text
 };
 
 constexpr auto sCases = std::to_array<Case>({
-	{"25", kTimeDisplay_25Timecode, kFrameRate_VideoPAL, {25, 1}, 0},
-	{"29.97df", kTimeDisplay_2997DropTimecode, kFrameRate_VideoNTSC, {30'000, 1'001}, AV_TIMECODE_FLAG_DROPFRAME},
-	{"59.94df", kTimeDisplay_5994DropTimecode, kFrameRate_VideoNTSC_HD, {60'000, 1'001}, AV_TIMECODE_FLAG_DROPFRAME},
+	{"25 fps", kTimeDisplay_25Timecode, kFrameRate_VideoPAL, {25, 1}, 0, 14},
+	{"29.97 drop-frame", kTimeDisplay_2997DropTimecode, kFrameRate_VideoNTSC, {30'000, 1'001},
+		AV_TIMECODE_FLAG_DROPFRAME, 12},
+	{"59.94 drop-frame", kTimeDisplay_5994DropTimecode, kFrameRate_VideoNTSC_HD, {60'000, 1'001},
+		AV_TIMECODE_FLAG_DROPFRAME, 12},
 });
 
 // The frame numbers, in an order that keeps the processor from learning the digits that follow.
@@ -47,144 +53,189 @@ std::vector<int> SpreadFrames(const Case& inCase)
 	return frames;
 }
 
-TickTime FrameTime(const Case& inCase, std::int64_t inFrame)
-{
-	return TickTime(inFrame * inCase.mRate.GetTicksPerFrame());
-}
-
 std::vector<TickTime> SpreadTimes(const Case& inCase)
 {
 	std::vector<TickTime> times;
 	for (const int frame : SpreadFrames(inCase))
-		times.push_back(FrameTime(inCase, frame));
+		times.emplace_back(frame * inCase.mRate.GetTicksPerFrame());
 	return times;
 }
 
-std::vector<zoncore::UTF16String> SpreadTexts(const Case& inCase)
+// Texts that lie one behind the other, as the short strings of the peer do: what is measured is reading, not memory.
+template <class Char>
+struct ShortText
 {
-	std::vector<zoncore::UTF16String> texts;
+	static constexpr std::size_t kLength = 11;
+
+	std::basic_string_view<Char> Get() const { return {mChars.data(), kLength}; }
+
+	std::array<Char, 32 / sizeof(Char)> mChars{};
+};
+
+template <class Char>
+std::vector<ShortText<Char>> SpreadTexts(const Case& inCase)
+{
+	std::vector<ShortText<Char>> texts(kFrames);
+	auto text = texts.begin();
 	for (const TickTime time : SpreadTimes(inCase))
-		texts.push_back(TimeToTimecode(time, inCase.mRate, inCase.mDisplay));
+		TimeToTimecode(std::span<Char>((text++)->mChars), time, inCase.mRate, inCase.mDisplay);
 	return texts;
 }
 
-// One iteration is one conversion of one of the inputs.
-template <class Inputs, class Convert>
-void Measure(benchmark::State& ioState, const Inputs& inInputs, Convert inConvert)
+std::vector<TimecodeFields> SpreadFields(const Case& inCase)
 {
-	auto input = inInputs.begin();
-	for (auto _ : ioState)
+	const std::vector<TickTime> times = SpreadTimes(inCase);
+	std::vector<TimecodeFields> fields(times.size());
+	TimesToHMSF(fields, times, inCase.mRate, inCase.mDisplay);
+	return fields;
+}
+
+// A column at once; inFill fills it.
+template <class Row, class MakeInputs, class Fill>
+Work FillColumn(MakeInputs inMakeInputs, Fill inFill)
+{
+	return [inMakeInputs, inFill](benchmark::State& ioState)
 	{
-		benchmark::DoNotOptimize(inConvert(*input));
-		if (++input == inInputs.end())
-			input = inInputs.begin();
-	}
-}
-
-// ---- Text ------------------------------------------------------------------------------------------------------------
-
-void TextOut(benchmark::State& ioState, const Case& inCase)
-{
-	Measure(ioState, SpreadTimes(inCase),
-		[&](TickTime inTime) { return TimeToTimecode(inTime, inCase.mRate, inCase.mDisplay); });
-}
-
-void TextOutLibavutil(benchmark::State& ioState, const Case& inCase)
-{
-	AVTimecode timecode;
-	av_timecode_init(&timecode, inCase.mAVRate, static_cast<int>(inCase.mAVFlags), 0, nullptr);
-	std::array<char, AV_TIMECODE_STR_SIZE> text;
-	Measure(ioState, SpreadFrames(inCase),
-		[&](int inFrame) { return *av_timecode_make_string(&timecode, text.data(), inFrame); });
-}
-
-void TextIn(benchmark::State& ioState, const Case& inCase)
-{
-	Measure(ioState, SpreadTexts(inCase),
-		[&](const zoncore::UTF16String& inText) { return TimecodeToTime(inText, inCase.mRate, inCase.mDisplay); });
-}
-
-void TextInLibavutil(benchmark::State& ioState, const Case& inCase)
-{
-	std::vector<std::string> texts;
-	for (const zoncore::UTF16String& text : SpreadTexts(inCase))
-		texts.push_back(zoncore::utility::UTF16to8(text));
-	AVTimecode timecode;
-	Measure(ioState, texts,
-		[&](const std::string& inText)
+		const auto inputs = inMakeInputs();
+		std::vector<Row> rows(inputs.size());
+		for (auto _ : ioState)
 		{
-			av_timecode_init_from_string(&timecode, inCase.mAVRate, inText.c_str(), nullptr);
+			inFill(rows, inputs);
+			benchmark::DoNotOptimize(rows.data());
+			benchmark::ClobberMemory();
+		}
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inputs.size()));
+	};
+}
+
+// ---- The peer --------------------------------------------------------------------------------------------------------
+
+Work PeerTextOut(const Case& inCase)
+{
+	AVTimecode timecode;
+	av_timecode_init(&timecode, inCase.mAVRate, inCase.mAVFlags, 0, nullptr);
+	return ForEach([&inCase] { return SpreadFrames(inCase); },
+		[timecode, text = std::array<char, AV_TIMECODE_STR_SIZE>()](int inFrame) mutable
+		{ return *av_timecode_make_string(&timecode, text.data(), inFrame); });
+}
+
+Work PeerTextIn(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadTexts<char>(inCase); },
+		[&inCase](const ShortText<char>& inText)
+		{
+			AVTimecode timecode;
+			av_timecode_init_from_string(&timecode, inCase.mAVRate, inText.mChars.data(), nullptr);
 			return timecode.start;
 		});
 }
 
-// ---- Numbers ---------------------------------------------------------------------------------------------------------
+// ---- Ours ------------------------------------------------------------------------------------------------------------
 
-struct Fields
+template <class Char>
+Work TextIntoBuffer(const Case& inCase)
 {
-	unsigned int mHours, mMinutes, mSeconds;
-	unsigned long long mFrames;
-	bool mNegative;
-};
-
-Fields Split(const Case& inCase, TickTime inTime)
-{
-	Fields fields;
-	TimeToHMSF(fields.mHours, fields.mMinutes, fields.mSeconds, fields.mFrames, fields.mNegative, inTime, inCase.mRate,
-		inCase.mDisplay);
-	return fields;
+	return ForEach([&inCase] { return SpreadTimes(inCase); },
+		[&inCase, text = std::array<Char, kLongestTimecode>()](TickTime inTime) mutable
+		{
+			TimeToTimecode(std::span(text), inTime, inCase.mRate, inCase.mDisplay);
+			return text[0];
+		});
 }
 
-void FieldsOut(benchmark::State& ioState, const Case& inCase)
+Work TextOut(const Case& inCase)
 {
-	Measure(ioState, SpreadTimes(inCase), [&](TickTime inTime) { return Split(inCase, inTime); });
+	return ForEach([&inCase] { return SpreadTimes(inCase); },
+		[&inCase](TickTime inTime) { return TimeToTimecode(inTime, inCase.mRate, inCase.mDisplay); });
 }
 
-void FieldsIn(benchmark::State& ioState, const Case& inCase)
+Work TextColumn(const Case& inCase)
 {
-	std::vector<Fields> fields;
-	for (const TickTime time : SpreadTimes(inCase))
-		fields.push_back(Split(inCase, time));
-	Measure(ioState, fields,
-		[&](const Fields& inFields)
+	return FillColumn<TimecodeText>([&inCase] { return SpreadTimes(inCase); },
+		[&inCase](auto& outTexts, const auto& inTimes)
+		{ TimesToTimecode(outTexts, inTimes, inCase.mRate, inCase.mDisplay); });
+}
+
+Work TextIn(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadTexts<zoncore::UTF16Char>(inCase); },
+		[&inCase](const ShortText<zoncore::UTF16Char>& inText)
+		{ return TimecodeToTime(inText.Get(), inCase.mRate, inCase.mDisplay); });
+}
+
+Work TextColumnIn(const Case& inCase)
+{
+	return [&inCase](benchmark::State& ioState)
+	{
+		const auto texts = SpreadTexts<zoncore::UTF16Char>(inCase);
+		const auto views = [&texts]
+		{
+			std::vector<zoncore::UTF16StringView> result;
+			for (const auto& text : texts)
+				result.push_back(text.Get());
+			return result;
+		};
+		FillColumn<TickTime>(views,
+			[&inCase](auto& outTimes, const auto& inViews)
+			{ TimecodesToTimes(outTimes, inViews, inCase.mRate, inCase.mDisplay); })(ioState);
+	};
+}
+
+Work FieldsOut(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadTimes(inCase); },
+		[&inCase](TickTime inTime)
+		{
+			TimecodeFields fields;
+			TimeToHMSF(fields.mHours, fields.mMinutes, fields.mSeconds, fields.mFrames, fields.mNegative, inTime,
+				inCase.mRate, inCase.mDisplay);
+			return fields.mFrames;
+		});
+}
+
+Work FieldsColumn(const Case& inCase)
+{
+	return FillColumn<TimecodeFields>([&inCase] { return SpreadTimes(inCase); },
+		[&inCase](auto& outFields, const auto& inTimes)
+		{ TimesToHMSF(outFields, inTimes, inCase.mRate, inCase.mDisplay); });
+}
+
+Work FieldsIn(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadFields(inCase); },
+		[&inCase](const TimecodeFields& inFields)
 		{
 			return HMSFToTime(inFields.mHours, inFields.mMinutes, inFields.mSeconds, inFields.mFrames,
 				inFields.mNegative, inCase.mRate, inCase.mDisplay);
 		});
 }
 
-void RatioOut(benchmark::State& ioState, const Case& inCase)
+[[maybe_unused]] const bool sAdded = []
 {
-	Measure(ioState, SpreadTimes(inCase), [](TickTime inTime) { return TimeToRatioTime(inTime); });
-}
-
-void RatioIn(benchmark::State& ioState, const Case& inCase)
-{
-	std::vector<RatioTime> times;
-	for (const TickTime time : SpreadTimes(inCase))
-		times.push_back(TimeToRatioTime(time));
-	Measure(ioState, times, [](RatioTime inTime) { return RatioTimeToTime(inTime); });
-}
-
-void Register(const char* inName, void (*inFunction)(benchmark::State&, const Case&))
-{
+	constexpr const char* kArea = "Timecode";
 	for (const Case& row : sCases)
-		benchmark::RegisterBenchmark((std::string(inName) + "/" + row.mName).c_str(),
-			[inFunction, &row](benchmark::State& ioState) { inFunction(ioState, row); });
-}
-
-[[maybe_unused]] const bool sRegistered = []
-{
-	Register("TimeToTimecode", TextOut);
-	Register("av_timecode_make_string", TextOutLibavutil);
-	Register("TimecodeToTime", TextIn);
-	Register("av_timecode_init_from_string", TextInLibavutil);
-	Register("TimeToHMSF", FieldsOut);
-	Register("HMSFToTime", FieldsIn);
-	Register("TimeToRatioTime", RatioOut);
-	Register("RatioTimeToTime", RatioIn);
+	{
+		const auto with = [&row](const char* inWhat) { return std::string(inWhat) + ", " + row.mName; };
+		const std::vector<Peer> out{{"libavutil", PeerTextOut(row), row.mWantedIntoBuffer}};
+		Compare(kArea, with("text into a buffer of char"), TextIntoBuffer<char>(row), out);
+		Compare(kArea, with("text into a buffer of UTF-16"), TextIntoBuffer<zoncore::UTF16Char>(row), out);
+		Compare(kArea, with("text as a string"), TextOut(row), {{"libavutil", PeerTextOut(row)}});
+		Compare(kArea, with("column of texts, a row"), TextColumn(row), {{"libavutil", PeerTextOut(row)}});
+		Compare(kArea, with("text in"), TextIn(row), {{"libavutil", PeerTextIn(row), 10}});
+		Compare(kArea, with("column of texts in, a row"), TextColumnIn(row), {{"libavutil", PeerTextIn(row), 10}});
+		Compare(kArea, with("fields"), FieldsOut(row));
+		Compare(kArea, with("column of fields, a row"), FieldsColumn(row));
+		Compare(kArea, with("fields in"), FieldsIn(row));
+	}
+	const auto rates = [] { return std::vector<FrameRate>(AllFrameRates().begin(), AllFrameRates().end()); };
+	Compare(kArea, "description of a rate as a string",
+		ForEach(rates, [](FrameRate inRate) { return FrameRateDescription(inRate); }));
+	Compare(kArea, "description of a rate into a buffer",
+		ForEach(rates,
+			[text = std::array<zoncore::UTF16Char, 64>()](FrameRate inRate) mutable
+			{ return FrameRateDescription(std::span(text), inRate); }));
 	return true;
 }();
 
 }   // namespace
-}   // namespace zonmediatypes
+}   // namespace benchmarks

@@ -1,11 +1,16 @@
 // Look-up, conversion cost, selection and sizes of pixel formats beside libavutil's counterparts, each over the same number
 // of formats: all of ours, and as many of libavutil's software formats.
 
+#include "Comparison.h"
+
 #include "zonmediatypes/PixelFormatSelection.h"
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
 
-#include <benchmark/benchmark.h>
+#include <array>
+#include <cstddef>
+#include <string>
+#include <vector>
 
 extern "C"
 {
@@ -13,14 +18,12 @@ extern "C"
 #include <libavutil/pixdesc.h>
 }
 
-#include <algorithm>
-#include <cstddef>
-#include <vector>
-
-namespace zonmediatypes
+namespace benchmarks
 {
 namespace
 {
+
+using namespace zonmediatypes;   // NOLINT(google-build-using-namespace)
 
 constexpr int kWidth = 1'920;
 constexpr int kHeight = 1'080;
@@ -40,9 +43,20 @@ std::vector<AVPixelFormat> PeerFormats()
 	return formats;
 }
 
+// All pairs of a catalogue.
+template <class Formats>
+auto Pairs(const Formats& inFormats)
+{
+	std::vector<std::array<typename Formats::value_type, 2>> pairs;
+	for (const auto from : inFormats)
+		for (const auto to : inFormats)
+			pairs.push_back({from, to});
+	return pairs;
+}
+
 // inCount formats from the whole of a catalogue, at equal distances.
 template <class Formats>
-Formats Spread(const Formats& inAll, std::size_t inCount, std::size_t inFirst)
+Formats Spread(const Formats& inAll, std::size_t inCount, std::size_t inFirst = 0)
 {
 	Formats formats;
 	for (std::size_t i = 0; i < inCount; ++i)
@@ -50,89 +64,29 @@ Formats Spread(const Formats& inAll, std::size_t inCount, std::size_t inFirst)
 	return formats;
 }
 
-// Shows the time of one item beside that of the loop over all.
-void CountItems(benchmark::State& ioState, std::size_t inItems)
+Work Cost(RenderQuality inQuality)
 {
-	ioState.counters["item"] = benchmark::Counter(
-		static_cast<double>(inItems), benchmark::Counter::kIsIterationInvariantRate | benchmark::Counter::kInvert);
+	return ForEach([] { return Pairs(OurFormats()); },
+		[inQuality](const auto& inPair)
+		{ return PixelConversionCost(inPair[0].mProperties, inPair[1].mProperties, inQuality); });
 }
 
-// ---- Look-up by code -------------------------------------------------------------------------------------------------
-
-void Lookup(benchmark::State& ioState)
+Work PeerLoss()
 {
-	const PixelFormats formats = OurFormats();
-	for (auto _ : ioState)
-		for (const PixelFormat format : formats)
-			benchmark::DoNotOptimize(LookupPropertiesForName(format.mName));
-	CountItems(ioState, formats.size());
+	return ForEach([] { return Pairs(PeerFormats()); },
+		[](const auto& inPair) { return av_get_pix_fmt_loss(inPair[1], inPair[0], 1); });
 }
-BENCHMARK(Lookup);
-
-void LibavutilLookup(benchmark::State& ioState)
-{
-	const std::vector<AVPixelFormat> formats = PeerFormats();
-	for (auto _ : ioState)
-		for (const AVPixelFormat format : formats)
-			benchmark::DoNotOptimize(av_pix_fmt_desc_get(format));
-	CountItems(ioState, formats.size());
-}
-BENCHMARK(LibavutilLookup);
-
-// What an index replaces.
-void LookupByScan(benchmark::State& ioState)
-{
-	const PixelFormats formats = OurFormats();
-	for (auto _ : ioState)
-		for (const PixelFormat format : formats)
-			benchmark::DoNotOptimize(std::find_if(AllPixelFormatsBegin(), AllPixelFormatsEnd(),
-				[=](PixelFormat inFormat) {
-					return inFormat.mName == format.mName;
-				})->mProperties);
-	CountItems(ioState, formats.size());
-}
-BENCHMARK(LookupByScan);
-
-// ---- Conversion cost -------------------------------------------------------------------------------------------------
-
-void Cost(benchmark::State& ioState, RenderQuality inQuality)
-{
-	const PixelFormats formats = OurFormats();
-	for (auto _ : ioState)
-		for (const PixelFormat& from : formats)
-			for (const PixelFormat& to : formats)
-				benchmark::DoNotOptimize(PixelConversionCost(from.mProperties, to.mProperties, inQuality));
-	CountItems(ioState, formats.size() * formats.size());
-}
-BENCHMARK_CAPTURE(Cost, Low, kRenderQuality_Low);
-BENCHMARK_CAPTURE(Cost, High, kRenderQuality_High);
-
-void LibavutilLoss(benchmark::State& ioState)
-{
-	const std::vector<AVPixelFormat> formats = PeerFormats();
-	for (auto _ : ioState)
-		for (const AVPixelFormat from : formats)
-			for (const AVPixelFormat to : formats)
-				benchmark::DoNotOptimize(av_get_pix_fmt_loss(to, from, 1));
-	CountItems(ioState, formats.size() * formats.size());
-}
-BENCHMARK(LibavutilLoss);
 
 // ---- Nearest of a list -----------------------------------------------------------------------------------------------
 
-// One format against a list, for each of the catalogue.
-void NearestSource(benchmark::State& ioState)
+Work Nearest(std::size_t inChoices)
 {
-	const PixelFormats targets = OurFormats();
-	const PixelFormats sources = Spread(targets, static_cast<std::size_t>(ioState.range(0)), 0);
-	for (auto _ : ioState)
-		for (const PixelFormat target : targets)
-			benchmark::DoNotOptimize(SelectNearestSourcePixelFormat(sources, target.mProperties, kRenderQuality_High));
-	CountItems(ioState, targets.size());
+	return ForEach(OurFormats,
+		[sources = Spread(OurFormats(), inChoices)](PixelFormat inTarget)
+		{ return SelectNearestSourcePixelFormat(sources, inTarget.mProperties, kRenderQuality_High); });
 }
-BENCHMARK(NearestSource)->Arg(8)->Arg(74);
 
-AVPixelFormat PeerNearest(const std::vector<AVPixelFormat>& inChoices, AVPixelFormat inSource)
+AVPixelFormat PeerBest(const std::vector<AVPixelFormat>& inChoices, AVPixelFormat inSource)
 {
 	AVPixelFormat best = AV_PIX_FMT_NONE;
 	int loss = 0;
@@ -141,85 +95,96 @@ AVPixelFormat PeerNearest(const std::vector<AVPixelFormat>& inChoices, AVPixelFo
 	return best;
 }
 
-void LibavutilNearest(benchmark::State& ioState)
+Work PeerNearest(std::size_t inChoices)
 {
-	const std::vector<AVPixelFormat> sources = PeerFormats();
-	const std::vector<AVPixelFormat> choices = Spread(sources, static_cast<std::size_t>(ioState.range(0)), 0);
-	for (auto _ : ioState)
-		for (const AVPixelFormat source : sources)
-			benchmark::DoNotOptimize(PeerNearest(choices, source));
-	CountItems(ioState, sources.size());
+	return ForEach(PeerFormats,
+		[choices = Spread(PeerFormats(), inChoices)](AVPixelFormat inSource) { return PeerBest(choices, inSource); });
 }
-BENCHMARK(LibavutilNearest)->Arg(8)->Arg(74);
 
-// Two lists without a common format: all pairs are compared. The peer takes one list for each format of the other.
-void NearestBetweenLists(benchmark::State& ioState)
+// Two lists without a common format: all pairs are compared. An item is a pair.
+Work NearestBetweenLists(std::size_t inCount)
 {
-	const auto count = static_cast<std::size_t>(ioState.range(0));
-	const PixelFormats sources = Spread(OurFormats(), count, 0);
-	PixelFormats destinations = Spread(OurFormats(), count, 4);
-	for (PixelFormat& format : destinations)
-		format.mName = kPixelFormatFourCC_Any;
-	for (auto _ : ioState)
-		benchmark::DoNotOptimize(
-			SelectNearestPixelFormat(sources, kPixelFormat_BGRA_4444_8u, destinations, kRenderQuality_High, false));
-	CountItems(ioState, count * count);
+	return [inCount](benchmark::State& ioState)
+	{
+		const PixelFormats sources = Spread(OurFormats(), inCount);
+		PixelFormats destinations = Spread(OurFormats(), inCount, 4);
+		for (PixelFormat& format : destinations)
+			format.mName = kPixelFormatFourCC_Any;
+		for (auto _ : ioState)
+			benchmark::DoNotOptimize(
+				SelectNearestPixelFormat(sources, kPixelFormat_BGRA_4444_8u, destinations, kRenderQuality_High, false));
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inCount * inCount));
+	};
 }
-BENCHMARK(NearestBetweenLists)->Arg(8)->Arg(74);
 
-void LibavutilBetweenLists(benchmark::State& ioState)
+// The peer takes one list for each format of the other.
+Work PeerBetweenLists(std::size_t inCount)
 {
-	const auto count = static_cast<std::size_t>(ioState.range(0));
-	const std::vector<AVPixelFormat> sources = Spread(PeerFormats(), count, 0);
-	const std::vector<AVPixelFormat> choices = Spread(PeerFormats(), count, 4);
-	for (auto _ : ioState)
-		for (const AVPixelFormat source : sources)
-			benchmark::DoNotOptimize(PeerNearest(choices, source));
-	CountItems(ioState, count * count);
+	return [inCount](benchmark::State& ioState)
+	{
+		const std::vector<AVPixelFormat> sources = Spread(PeerFormats(), inCount);
+		const std::vector<AVPixelFormat> choices = Spread(PeerFormats(), inCount, 4);
+		for (auto _ : ioState)
+			for (const AVPixelFormat source : sources)
+				benchmark::DoNotOptimize(PeerBest(choices, source));
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inCount * inCount));
+	};
 }
-BENCHMARK(LibavutilBetweenLists)->Arg(8)->Arg(74);
 
-// ---- Sizes -----------------------------------------------------------------------------------------------------------
+// ---- Growth ----------------------------------------------------------------------------------------------------------
 
-void RowSize(benchmark::State& ioState)
+// There is no removal: sizes are measured in the order in which they grow.
+PixelFormatName CustomName(std::size_t inIndex)
 {
-	const PixelFormats formats = OurFormats();
-	for (auto _ : ioState)
-		for (const PixelFormat format : formats)
-			benchmark::DoNotOptimize(UncompressedPixelFormatRowBytes(format, kWidth));
-	CountItems(ioState, formats.size());
+	const auto letter = [&](std::size_t inPlace) { return static_cast<char>('a' + inIndex / inPlace % 26); };
+	return MakePixelFormatName('@', letter(26 * 26), letter(26), letter(1));
 }
-BENCHMARK(RowSize);
 
-void LibavutilRowSize(benchmark::State& ioState)
+Work CustomLookup(std::size_t inRegistered)
 {
-	const std::vector<AVPixelFormat> formats = PeerFormats();
-	for (auto _ : ioState)
-		for (const AVPixelFormat format : formats)
-			benchmark::DoNotOptimize(av_image_get_linesize(format, kWidth, 0));
-	CountItems(ioState, formats.size());
+	return [inRegistered](benchmark::State& ioState)
+	{
+		static std::size_t sRegistered = 0;
+		for (; sRegistered < inRegistered; ++sRegistered)
+			RegisterCustomPixelFormatProperties(CustomName(sRegistered), kPixelFormat_BGRA_4444_8u.mProperties);
+		std::vector<PixelFormatName> names;
+		for (std::size_t i = 0; i < 1'024; ++i)
+			names.push_back(CustomName(i * 61'803 % inRegistered));
+		ForEach([&] { return names; }, [](PixelFormatName inName) { return LookupPropertiesForName(inName); })(ioState);
+	};
 }
-BENCHMARK(LibavutilRowSize);
 
-void FrameSize(benchmark::State& ioState)
+[[maybe_unused]] const bool sAdded = []
 {
-	const PixelFormats formats = OurFormats();
-	for (auto _ : ioState)
-		for (const PixelFormat format : formats)
-			benchmark::DoNotOptimize(PixelFormatSize(format, kWidth, kHeight));
-	CountItems(ioState, formats.size());
-}
-BENCHMARK(FrameSize);
+	constexpr const char* kArea = "Video";
+	Compare(kArea, "look-up by code",
+		ForEach(OurFormats, [](PixelFormat inFormat) { return LookupPropertiesForName(inFormat.mName); }),
+		{{"libavutil", ForEach(PeerFormats, [](AVPixelFormat inFormat) { return av_pix_fmt_desc_get(inFormat); })}});
+	Compare(kArea, "cost of a conversion, high quality", Cost(kRenderQuality_High), {{"libavutil", PeerLoss()}});
+	Compare(kArea, "cost of a conversion, low quality", Cost(kRenderQuality_Low), {{"libavutil", PeerLoss()}});
+	for (const std::size_t count : {8U, 74U})
+	{
+		const std::string number = std::to_string(count);
+		Compare(kArea, "nearest of " + number, Nearest(count), {{"libavutil", PeerNearest(count)}});
+		Compare(kArea, "nearest between two lists of " + number + ", a pair", NearestBetweenLists(count),
+			{{"libavutil", PeerBetweenLists(count)}});
+	}
+	Compare(kArea, "row size",
+		ForEach(OurFormats, [](PixelFormat inFormat) { return UncompressedPixelFormatRowBytes(inFormat, kWidth); }),
+		{{"libavutil",
+			ForEach(PeerFormats, [](AVPixelFormat inFormat) { return av_image_get_linesize(inFormat, kWidth, 0); })}});
+	Compare(kArea, "frame size",
+		ForEach(OurFormats, [](PixelFormat inFormat) { return PixelFormatSize(inFormat, kWidth, kHeight); }),
+		{{"libavutil",
+			ForEach(PeerFormats,
+				[](AVPixelFormat inFormat) { return av_image_get_buffer_size(inFormat, kWidth, kHeight, 64); })}});
 
-void LibavutilFrameSize(benchmark::State& ioState)
-{
-	const std::vector<AVPixelFormat> formats = PeerFormats();
-	for (auto _ : ioState)
-		for (const AVPixelFormat format : formats)
-			benchmark::DoNotOptimize(av_image_get_buffer_size(format, kWidth, kHeight, 64));
-	CountItems(ioState, formats.size());
-}
-BENCHMARK(LibavutilFrameSize);
+	constexpr auto kListSizes = std::to_array<std::size_t>({1, 10, 100, 1'000});
+	Grow("nearest between two lists of so many formats, a pair", kListSizes, NearestBetweenLists);
+	constexpr auto kRegistrySizes = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000});
+	Grow("look-up of a custom format among so many (a look-up)", kRegistrySizes, CustomLookup);
+	return true;
+}();
 
 }   // namespace
-}   // namespace zonmediatypes
+}   // namespace benchmarks
