@@ -1,12 +1,13 @@
 // Layouts of any labels: conversion, ordering, maps, formats and descriptions.
 
-#include "FuzzInput.h"
+#include "Checks.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/AudioChannelMap.h"
 #include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Descriptions.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <numeric>
 
@@ -27,7 +28,7 @@ AudioChannelLabel TakeLabel(FuzzInput& ioInput)
 
 AudioChannelLayout TakeLayout(FuzzInput& ioInput)
 {
-	AudioChannelLayout layout(ioInput.Below(12));
+	AudioChannelLayout layout(ioInput.Below(9));
 	for (AudioChannelDescription& channel : layout)
 		channel = TakeLabel(ioInput);
 	return layout;
@@ -50,7 +51,7 @@ void CheckPairs(FuzzInput& ioInput)
 void CheckConversion(FuzzInput& ioInput)
 {
 	const AudioChannelLayout source = TakeLayout(ioInput), destination = TakeLayout(ioInput);
-	ChannelConversionMatrix matrix;
+	ChannelConversionMatrix matrix{{77}};
 	ComputeChannelConversionMatrix(source, destination, matrix);
 	Require(matrix.size() == destination.size(), "a row for each destination channel");
 	for (const auto& row : matrix)
@@ -72,6 +73,9 @@ void CheckConversion(FuzzInput& ioInput)
 void CheckOrdering(FuzzInput& ioInput)
 {
 	const AudioChannelLayout source = TakeLayout(ioInput), destination = TakeLayout(ioInput);
+	for (const AudioChannelDescription channel : destination)
+		Require(HasChannelLabel(source, channel.mLabel) == (std::count(source.begin(), source.end(), channel) > 0),
+			"labels are found");
 	ChannelOrdering ordering{77};
 	if (RemapChannelOrdering(source, destination, ordering))
 	{
@@ -95,37 +99,85 @@ void CheckOrdering(FuzzInput& ioInput)
 	Require(RemapChannelOrdering(source, source, ordering), "every layout is an ordering of itself");
 }
 
+std::size_t CountLabels(const ChannelMap& inMap)
+{
+	std::size_t count = 0;
+	for (std::size_t i = 0; i < inMap.GetNumberOfChannels(); ++i)
+		count += inMap.GetChannelLayout(static_cast<std::int32_t>(i)).size();
+	return count;
+}
+
+void CheckMove(ChannelMap& ioMap, AudioChannelLabel inLabel, std::int32_t inChannel)
+{
+	const std::size_t before = CountLabels(ioMap);
+	bool isCarried = false;
+	for (std::size_t i = 0; i < ioMap.GetNumberOfChannels(); ++i)
+		isCarried = isCarried || HasChannelLabel(ioMap.GetChannelLayout(static_cast<std::int32_t>(i)), inLabel);
+	ioMap.SetDeviceChannelIndexForChannelLabel(inLabel, inChannel);
+	const std::size_t taken = before - (isCarried ? 1 : 0), after = CountLabels(ioMap);
+	if (inChannel < 0)
+		return Require(after == taken, "a label is taken away once");
+	Require(after == taken || after == taken + 1, "a label is put in once");
+	Require(HasChannelLabel(ioMap.GetChannelLayout(ioMap.Find(inChannel)), inLabel), "the channel has the label");
+}
+
+// Changes one entry of a map, and requires that the others stay.
+void CheckChange(ChannelMap& ioMap, std::int32_t inIndex, AudioChannelLabel inLabel, std::int32_t inChannel)
+{
+	const ChannelMap before = ioMap;
+	const auto count = static_cast<std::int32_t>(ioMap.GetNumberOfChannels());
+	const bool isInside = inIndex >= 0 && inIndex < count;
+	ioMap.SetChannel(inIndex, inChannel);
+	ioMap.SetChannelLayout(inIndex, {inLabel});
+	Require(ioMap[inIndex] == (isInside ? inChannel : -1), "an entry has the channel it was assigned to");
+	Require(ioMap.GetChannelLayout(inIndex) == (isInside ? AudioChannelLayout{inLabel} : AudioChannelLayout()),
+		"an entry has the labels it was given");
+	ChannelMap restored = ioMap;
+	restored.SetChannel(inIndex, before[inIndex]);
+	restored.SetChannelLayout(inIndex, before.GetChannelLayout(inIndex));
+	Require(restored == before && (isInside || ioMap == before), "the other entries stay");
+}
+
+const ChannelMap sCanonicalOrder(36);
+
 void CheckMap(FuzzInput& ioInput)
 {
+	constexpr std::array<std::int32_t, 8> kCounts{-1, 0, 1, 2, 3, 6, 8, 40};
 	ChannelMap map = ioInput.Flag() ? ChannelMap(TakeLayout(ioInput))
-									: ChannelMap::CreateDefaultChannelMap(ioInput.Any<std::int8_t>());
-	while (!ioInput.IsEmpty())
+									: ChannelMap::CreateDefaultChannelMap(ioInput.OneOf(kCounts));
+	for (int steps = 0; steps < 4 && !ioInput.IsEmpty(); ++steps)
 	{
-		const std::int32_t index = ioInput.Any<std::int8_t>();
+		const std::int32_t index = ioInput.Any<std::int8_t>() % 48;
 		const auto channel = static_cast<std::int32_t>(ioInput.Below(8)) - 2;
 		const AudioChannelLabel label = TakeLabel(ioInput);
+		const std::size_t count = map.GetNumberOfChannels();
 		switch (ioInput.Below(4))
 		{
 		case 0:
-			map.SetChannel(index, channel);
+			CheckChange(map, index, label, channel);
 			break;
 		case 1:
-			map.SetChannelLayout(index, {label});
+			map.SetChannelLayout(index, TakeLayout(ioInput));
+			Require(map.GetNumberOfChannels() == count, "labels make no entries");
 			break;
 		case 2:
 			map.AddChannel({label}, channel);
+			Require(map[static_cast<std::int32_t>(count)] == channel, "an entry is added at the end");
 			break;
 		case 3:
-			map.SetDeviceChannelIndexForChannelLabel(label, channel);
-			static_cast<void>(map.GetSourceChannelIndexForChannelLabelIndex(index));
+			CheckMove(map, label, channel);
 			break;
 		}
 		const std::int32_t found = map.Find(channel);
 		Require(found == -1 || map[found] == channel, "what is found is there");
 		Require(map[static_cast<std::int32_t>(map.GetNumberOfChannels())] == -1, "outside there is nothing");
-		static_cast<void>(map.GetNumberOfAssignments());
-		Require(ChannelMap(map) == map, "copies are equal");
+		const AudioChannelLayout atPlace = sCanonicalOrder.GetChannelLayout(index);
+		Require(map.GetSourceChannelIndexForChannelLabelIndex(index)
+				== (atPlace.empty() ? -2 : map.GetSourceChannelIndexForChannelLabel(atPlace.front().mLabel)),
+			"a place is as good as its label");
 	}
+	Require(map.GetNumberOfAssignments() <= map.GetNumberOfChannels() * CountLabels(map), "channels have their labels");
+	Require(ChannelMap(map) == map, "copies are equal");
 }
 
 AudioFormat TakeFormat(FuzzInput& ioInput)
@@ -144,10 +196,17 @@ void CheckFormat(FuzzInput& ioInput)
 	Require(!exact(format, format) && !simple(format, format), "nothing is before itself");
 	Require(!(exact(format, other) && exact(other, format)), "the exact order has one direction");
 	Require(!(simple(format, other) && simple(other, format)), "the simple order has one direction");
+	const AudioFormat third = TakeFormat(ioInput);
+	Require(!exact(format, other) || !exact(other, third) || exact(format, third), "the exact order has no circles");
+	Require(!simple(format, other) || !simple(other, third) || simple(format, third), "nor has the simple one");
 	Require((format == other) == (!exact(format, other) && !exact(other, format)), "only equal formats are equivalent");
-	static_cast<void>(format.GetSampleAlignment());
+	const std::size_t count = format.GetChannelCount();
+	Require(count == 0 ? format.GetSampleAlignment() == 0 : format.GetSampleAlignment() % count == 0,
+		"every channel takes as many bytes");
+	const AudioChannelLayout before = format.GetChannelLayout();
 	NormalizeChannelOrder(format);
 	const AudioChannelLayout& layout = format.GetChannelLayout();
+	Require(ContainsSameChannelsIgnoreOrder(before, layout), "no channel is lost");
 	Require(std::is_sorted(layout.begin(), layout.end()), "channels are in order");
 }
 
@@ -167,27 +226,6 @@ void CheckDescriptions(FuzzInput& ioInput)
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	switch (input.Below(6))
-	{
-	case 0:
-		CheckPairs(input);
-		break;
-	case 1:
-		CheckConversion(input);
-		break;
-	case 2:
-		CheckOrdering(input);
-		break;
-	case 3:
-		CheckMap(input);
-		break;
-	case 4:
-		CheckFormat(input);
-		break;
-	case 5:
-		CheckDescriptions(input);
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf(
+		{CheckPairs, CheckConversion, CheckOrdering, CheckMap, CheckFormat, CheckDescriptions}, inData, inSize);
 }

@@ -1,11 +1,8 @@
 // Bars and beats of any meter and tempo.
 
-#include "FuzzInput.h"
-#include "zoncore/Debug.h"
-#include "zoncore/StringUtils.h"
-#include "zonmediatypes/TimeConversionUtils.h"
+#include "Checks.h"
+#include "SampleClockInput.h"
 
-#include <array>
 #include <cmath>
 
 namespace
@@ -15,12 +12,9 @@ using namespace zonmediatypes::utility;
 using zoncore::UTF16String;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
-
-BeatInfo TakeBeats(FuzzInput& ioInput)
-{
-	return {ioInput.Edge<std::int32_t>(), ioInput.Flag() ? 120 : ioInput.Any<double>(), ioInput.Edge<std::int32_t>(),
-		ioInput.Edge<std::int32_t>(), ioInput.Flag() ? 0 : ioInput.Any<double>()};
-}
+using zonfuzz::RequirePositionInBuffers;
+using zonfuzz::sBefore;
+using zonfuzz::TakeBeats;
 
 void CheckReading(FuzzInput& ioInput)
 {
@@ -46,11 +40,10 @@ void CheckWriting(FuzzInput& ioInput)
 	const double sampleRate = ioInput.Flag() ? ioInput.Any<double>() : 48'000;
 	const bool isDuration = ioInput.Flag();
 	const std::int32_t style = ioInput.Any<std::int8_t>();
-	const UTF16String before = zoncore::utility::AsciiToUTF16("before");
-	UTF16String text = before;
+	UTF16String text = sBefore;
 	const bool isWritten = ConvertSamplesToBarsAndBeats(text, samples, sampleRate, beats, isDuration, style);
 	Require(isWritten == (beats.iBeatsPerBar != 0), "only a bar without beats is misuse");
-	Require(isWritten == (text != before), "text is written whole or not at all");
+	Require(isWritten == (text != sBefore), "text is written whole or not at all");
 }
 
 // What a usual meter writes reads back within the tick that was cut off and the sample that is rounded to.
@@ -74,23 +67,39 @@ void CheckRoundTrip(FuzzInput& ioInput)
 		std::abs(static_cast<double>(again) - samples) <= samplesPerTick + 1, "bars and beats are exact to the tick");
 }
 
+// Both writers and both styles of a position agree.
+void CheckEntries(FuzzInput& ioInput)
+{
+	const BeatInfo beats = TakeBeats(ioInput);
+	const auto samples = ioInput.Edge<std::int64_t>();
+	const auto sampleRate = ioInput.Edge<std::int32_t>();
+	const bool isDuration = ioInput.Flag();
+	UTF16String direct = sBefore, text = sBefore;
+	const bool isWritten
+		= ConvertSamplesToBarsAndBeats(direct, static_cast<double>(samples), sampleRate, beats, isDuration, 2);
+	Require(isWritten
+			== ConvertSamplesToTimecode(
+				text, samples, sampleRate, kTimecodeFormat_BarsAndBeats, 30, &beats, isDuration),
+		"both writers take the same");
+	Require(text == direct, "both writers give the same");
+	RequirePositionInBuffers(text, samples, sampleRate, kTimecodeFormat_BarsAndBeats, 30, &beats, isDuration);
+	Require(!ConvertSamplesToTimecode(text, samples, sampleRate, kTimecodeFormat_BarsAndBeats, 30, nullptr, isDuration)
+			&& text == direct,
+		"without beats nothing is written");
+	if (beats.iTicksPerBeat == -1 || !isWritten)
+		return;
+	for (const std::int32_t style : {1, 0})
+	{
+		UTF16String shorter;
+		ConvertSamplesToBarsAndBeats(shorter, static_cast<double>(samples), sampleRate, beats, isDuration, style);
+		Require(text.starts_with(shorter) && shorter.size() < text.size(), "a shorter style is the beginning");
+		text = shorter;
+	}
+}
+
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	zoncore::debug::SetAssertDialog([](auto&&...) { return false; });
-	FuzzInput input(inData, inSize);
-	switch (input.Below(3))
-	{
-	case 0:
-		CheckReading(input);
-		break;
-	case 1:
-		CheckWriting(input);
-		break;
-	case 2:
-		CheckRoundTrip(input);
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf({CheckReading, CheckWriting, CheckRoundTrip, CheckEntries}, inData, inSize);
 }

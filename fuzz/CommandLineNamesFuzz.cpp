@@ -1,11 +1,16 @@
 // Rates, displays, times and layouts as they are typed on a command line: read whole or refused in one line.
 
-#include "FuzzInput.h"
+#include "Checks.h"
 #include "zonmedia/AudioNames.h"
 #include "zonmedia/TimeNames.h"
 #include "zonmedia/VideoNames.h"
 
+#include <algorithm>
+#include <cstring>
+#include <optional>
 #include <string>
+#include <string_view>
+#include <type_traits>
 
 namespace
 {
@@ -15,119 +20,181 @@ using namespace zonmediatypes;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
 
-// Calls inFunction, which may refuse the text that it was given.
-template <class Problem, class Function>
-void MayRefuse(Function&& inFunction)
+// Reads with inRead what may be no name, or else checks what was read.
+template <class Problem, class Read, class Check>
+void ReadAndCheck(std::string_view inText, Read&& inRead, Check&& inCheck)
 {
+	std::optional<std::invoke_result_t<Read, std::string_view>> value;
 	try
 	{
-		inFunction();
+		value = inRead(inText);
 	}
 	catch (const Problem& problem)
 	{
 		Require(*problem.what() != '\0', "a refusal has a reason");
+		Require(inText.find('\n') != std::string_view::npos || std::strchr(problem.what(), '\n') == nullptr,
+			"and its reason is one line");
 	}
+	if (value)
+		inCheck(*value);
 }
 
-void CheckRate(std::string_view inText)
+// A text of some characters: refusing one measures its distance to every name of a list.
+std::string_view TakeText(FuzzInput& ioInput)
 {
-	const Rate rate = ReadRate(inText);
-	Require(rate.mRate.GetTicksPerFrame() > 0 && rate.mRate.IsUsable(), "a rate that is read can be used");
-	Require(rate.mStated.mNumerator > 0 && rate.mStated.mDenominator > 0, "a rate is above 0");
-	Require(Reduced(rate.mStated) == rate.mStated, "a rate is stated in lowest terms");
-	const Rate again
-		= ReadRate(std::to_string(rate.mStated.mNumerator) + "/" + std::to_string(rate.mStated.mDenominator));
-	Require(again.mRate == rate.mRate && again.mIsRounded == rate.mIsRounded, "the fraction stands for the rate");
-	Require(!Text(rate).empty(), "a rate has a text");
+	return ioInput.Rest().substr(0, 16);
 }
 
-void CheckTime(std::string_view inText, TimeForm inForm, FrameRate inRate)
+void CheckRate(FuzzInput& ioInput)
 {
-	const TickTime time = ReadTime(inText, inRate, inForm);
-	if (!inForm.mDisplay)
-		Require(ReadTime(TimeText(time, inRate, inForm), inRate, inForm) == time, "ticks survive");
-	Require(!TimeText(time, inRate, inForm).empty(), "a time has a text");
+	ReadAndCheck<UsageProblem>(ioInput.Rest(), ReadRate,
+		[](const Rate& inRate)
+		{
+			Require(inRate.mRate.GetTicksPerFrame() > 0 && inRate.mRate.IsUsable(), "a rate that is read can be used");
+			Require(inRate.mStated.mNumerator > 0 && inRate.mStated.mDenominator > 0, "a rate is above 0");
+			Require(Reduced(inRate.mStated) == inRate.mStated, "a rate is stated in lowest terms");
+			const Rate again = ReadRate(
+				std::to_string(inRate.mStated.mNumerator) + "/" + std::to_string(inRate.mStated.mDenominator));
+			Require(again.mRate == inRate.mRate && again.mIsRounded == inRate.mIsRounded,
+				"the fraction stands for the rate");
+			Require(!Text(inRate).empty(), "a rate has a text");
+		});
 }
 
-void CheckLayout(std::string_view inText)
+void CheckTime(FuzzInput& ioInput)
 {
-	const AudioChannelLayout layout = ReadLayout(inText);
-	std::string abbreviations;
-	for (const AudioChannelDescription channel : layout)
-		abbreviations += Abbreviation(channel.mLabel) + ",";
-	Require(layout.empty() || ReadLayout(abbreviations) == layout, "a layout is the list of its abbreviations");
+	const TimeForm form = ioInput.OneOf(TimeForms()).mValue;
+	const FrameRate rate = ioInput.OneOf(AllFrameRates());
+	const auto read = [&](std::string_view inText) { return ReadTime(inText, rate, form); };
+	ReadAndCheck<InputProblem>(ioInput.Rest(), read,
+		[&](TickTime inTime)
+		{
+			const std::string text = TimeText(inTime, rate, form);
+			Require(!text.empty(), "a time has a text");
+			Require(form.mDisplay || ReadTime(text, rate, form) == inTime, "ticks survive");
+		});
 }
 
-void CheckFormats(std::string_view inText)
+void CheckLayout(FuzzInput& ioInput)
 {
-	const PixelFormats formats = ReadPixelFormats(inText);
-	std::string names;
-	for (const PixelFormat format : formats)
-		names += (names.empty() ? "" : ",") + NameOf(format);
-	Require(formats.empty() || ReadPixelFormats(names) == formats, "formats are the list of their names");
+	ReadAndCheck<UsageProblem>(TakeText(ioInput), ReadLayout,
+		[](const AudioChannelLayout& inLayout)
+		{
+			std::string abbreviations;
+			for (const AudioChannelDescription channel : inLayout)
+				abbreviations += Abbreviation(channel.mLabel) + ",";
+			Require(
+				inLayout.empty() || ReadLayout(abbreviations) == inLayout, "a layout is the list of its abbreviations");
+		});
 }
 
-void CheckSize(std::string_view inText)
+void CheckForm(FuzzInput& ioInput)
 {
-	const zoncore::PointT<int> size = ReadSize(inText);
-	Require(size.x > 0 && size.y > 0, "a size is above 0");
-	Require(ReadSize(std::to_string(size.x) + "x" + std::to_string(size.y)) == size, "a size survives");
+	ReadAndCheck<UsageProblem>(TakeText(ioInput), ReadTimeForm,
+		[](TimeForm inForm) { Require(ReadTimeForm(NameOf(inForm)) == inForm, "a form has a name"); });
 }
 
-void CheckShape(std::string_view inText)
+void CheckDistance(FuzzInput& ioInput)
 {
-	const PixelAspectRatio ratio = ReadPixelAspectRatio(inText);
-	const std::string text = std::to_string(ratio.GetNumerator()) + "/" + std::to_string(ratio.GetDenominator());
-	Require(ReadPixelAspectRatio(text) == ratio, "a shape survives");
-}
-
-void CheckDistance(std::string_view inText)
-{
-	const std::string_view left = inText.substr(0, inText.size() / 2), right = inText.substr(inText.size() / 2);
+	const std::string_view text = ioInput.Rest();
+	const std::string_view left = text.substr(0, text.size() / 2), right = text.substr(text.size() / 2);
 	const std::size_t distance = EditDistance(left, right);
 	Require(distance == EditDistance(right, left), "a distance has no direction");
 	Require(
 		EditDistance(left, left) == 0 && distance <= std::max(left.size(), right.size()), "and is no longer than text");
+	Require(IsSameName(left, right) == (distance == 0), "names without a distance are one");
+}
+
+void CheckFormats(FuzzInput& ioInput)
+{
+	ReadAndCheck<UsageProblem>(TakeText(ioInput), ReadPixelFormats,
+		[](const PixelFormats& inFormats)
+		{
+			std::string names;
+			for (const PixelFormat format : inFormats)
+				names += (names.empty() ? "" : ",") + NameOf(format);
+			Require(ReadPixelFormats(names) == inFormats, "formats are the list of their names");
+		});
+}
+
+void CheckSize(FuzzInput& ioInput)
+{
+	ReadAndCheck<UsageProblem>(ioInput.Rest(), ReadSize,
+		[](zoncore::PointT<int> inSize)
+		{
+			Require(inSize.x > 0 && inSize.y > 0, "a size is above 0");
+			Require(ReadSize(std::to_string(inSize.x) + "x" + std::to_string(inSize.y)) == inSize, "a size survives");
+		});
+}
+
+void CheckShape(FuzzInput& ioInput)
+{
+	ReadAndCheck<UsageProblem>(ioInput.Rest(), ReadPixelAspectRatio,
+		[](PixelAspectRatio inRatio)
+		{
+			const PixelAspectRatio again = ReadPixelAspectRatio(
+				std::to_string(inRatio.GetNumerator()) + "/" + std::to_string(inRatio.GetDenominator()));
+			Require(
+				again.GetNumerator() == inRatio.GetNumerator() && again.GetDenominator() == inRatio.GetDenominator(),
+				"a shape survives");
+		});
+}
+
+void CheckQuality(FuzzInput& ioInput)
+{
+	ReadAndCheck<UsageProblem>(TakeText(ioInput), ReadQuality,
+		[](RenderQuality inQuality)
+		{ Require(inQuality >= kRenderQuality_Draft && inQuality <= kRenderQuality_Max, "a quality is known"); });
+}
+
+// A name in capitals and small letters, with marks that do not count, as the input has it.
+std::string Rewritten(std::string_view inName, FuzzInput& ioInput)
+{
+	std::string text;
+	for (const char character : inName)
+	{
+		const auto change = ioInput.Any<std::uint8_t>();
+		if (change % 8 < 3)
+			text.push_back("_- "[change % 8]);
+		const bool isSmall = character >= 'a' && character <= 'z';
+		text.push_back(isSmall && change >= 128 ? static_cast<char>(character - 'a' + 'A') : character);
+	}
+	return text;
+}
+
+void CheckRewriting(FuzzInput& ioInput)
+{
+	const Named<AudioChannelLayout>& layout = LayoutNames()[ioInput.Below(LayoutNames().size())];
+	Require(ReadLayout(Rewritten(layout.mName, ioInput)) == layout.mValue, "a layout however it is written");
+	const Named<TimeForm>& form = TimeForms()[ioInput.Below(TimeForms().size())];
+	Require(ReadTimeForm(Rewritten(form.mName, ioInput)) == form.mValue, "a form however it is written");
+	const Named<PixelFormat>& format = PixelFormatNames()[ioInput.Below(PixelFormatNames().size())];
+	Require(ReadPixelFormat(Rewritten(format.mName, ioInput)) == format.mValue, "a format however it is written");
+	Require(ReadPixelFormat(CodeOf(format.mValue)).mName == format.mValue.mName, "a format by its code");
+}
+
+void CheckLists(FuzzInput& ioInput)
+{
+	PixelFormats formats;
+	AudioChannelLayout layout;
+	std::string formatNames, abbreviations;
+	for (std::size_t rest = 1 + ioInput.Below(5); rest > 0; --rest)
+	{
+		const Named<PixelFormat>& format = PixelFormatNames()[ioInput.Below(PixelFormatNames().size())];
+		formats.push_back(format.mValue);
+		formatNames += format.mName + (rest > 1 ? "," : "");
+		layout.emplace_back(ioInput.OneOf(AllAudioChannelLabels()));
+		abbreviations += Abbreviation(layout.back().mLabel) + ",";
+	}
+	Require(ReadPixelFormats(formatNames) == formats, "a list of names is the formats in order");
+	Require(ReadLayout(abbreviations) == layout, "a list of abbreviations is the channels in order");
 }
 
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	const std::size_t kind = input.Below(9);
-	const TimeForm form = TimeForms()[input.Below(TimeForms().size())].mValue;
-	const FrameRate rate = input.OneOf(AllFrameRates());
-	const std::string_view text = input.Rest();
-	switch (kind)
-	{
-	case 0:
-		MayRefuse<UsageProblem>([&] { CheckRate(text); });
-		break;
-	case 1:
-		MayRefuse<InputProblem>([&] { CheckTime(text, form, rate); });
-		break;
-	case 2:
-		MayRefuse<UsageProblem>([&] { CheckLayout(text); });
-		break;
-	case 3:
-		MayRefuse<UsageProblem>([&] { Require(!NameOf(ReadTimeForm(text)).empty(), "a form has a name"); });
-		break;
-	case 4:
-		CheckDistance(text);
-		break;
-	case 5:
-		MayRefuse<UsageProblem>([&] { CheckFormats(text); });
-		break;
-	case 6:
-		MayRefuse<UsageProblem>([&] { CheckSize(text); });
-		break;
-	case 7:
-		MayRefuse<UsageProblem>([&] { CheckShape(text); });
-		break;
-	case 8:
-		MayRefuse<UsageProblem>([&] { Require(ReadQuality(text) > 0, "a quality is known"); });
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf({CheckRate, CheckTime, CheckLayout, CheckForm, CheckDistance, CheckFormats, CheckSize,
+								 CheckShape, CheckQuality, CheckRewriting, CheckLists},
+		inData, inSize);
 }

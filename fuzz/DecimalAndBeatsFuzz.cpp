@@ -1,9 +1,7 @@
 // Decimal time, milliseconds and beats of the sample clock.
 
-#include "FuzzInput.h"
-#include "zoncore/Debug.h"
-#include "zoncore/StringUtils.h"
-#include "zonmediatypes/TimeConversionUtils.h"
+#include "Checks.h"
+#include "SampleClockInput.h"
 
 #include <array>
 #include <cmath>
@@ -15,14 +13,11 @@ using namespace zonmediatypes::utility;
 using zoncore::UTF16String;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
+using zonfuzz::RequirePositionInBuffers;
+using zonfuzz::sBefore;
+using zonfuzz::TakeBeats;
 
 constexpr std::array kFormats{kTimecodeFormat_Decimal, kTimecodeFormat_Milliseconds, kTimecodeFormat_Beats};
-
-BeatInfo TakeBeats(FuzzInput& ioInput)
-{
-	return {ioInput.Edge<std::int32_t>(), ioInput.Flag() ? 120 : ioInput.Any<double>(), ioInput.Edge<std::int32_t>(),
-		ioInput.Edge<std::int32_t>(), ioInput.Flag() ? 0 : ioInput.Any<double>()};
-}
 
 void CheckReading(FuzzInput& ioInput)
 {
@@ -48,22 +43,22 @@ void CheckWriting(FuzzInput& ioInput)
 	const auto samples = ioInput.Edge<std::int64_t>();
 	const auto sampleRate = ioInput.Edge<std::int32_t>();
 	const double tempo = ioInput.Flag() ? 120 : ioInput.Any<double>();
-	const UTF16String before = zoncore::utility::AsciiToUTF16("before");
-	UTF16String text = before;
+	UTF16String text = sBefore;
 	ConvertSamplesToDecimalTimecode(text, samples, sampleRate, ioInput.Flag());
-	Require(text != before && !text.empty(), "decimal time is always written");
-	text = before;
+	Require(text != sBefore && !text.empty(), "decimal time is always written");
+	text = sBefore;
 	ConvertSamplesToBeats(text, samples, sampleRate, tempo);
-	Require(text != before && !text.empty(), "beats are always written");
+	Require(text != sBefore && !text.empty(), "beats are always written");
 
 	const BeatInfo beats = TakeBeats(ioInput);
 	const TimecodeFormat format = ioInput.OneOf(kFormats);
-	const bool hasBeats = ioInput.Flag();
-	text = before;
-	const bool isWritten
-		= ConvertSamplesToTimecode(text, samples, sampleRate, format, 30, hasBeats ? &beats : nullptr, ioInput.Flag());
-	Require(isWritten == (format != kTimecodeFormat_Beats || hasBeats), "only missing beats are misuse");
-	Require(isWritten == (text != before), "text is written whole or not at all");
+	const BeatInfo* const given = ioInput.Flag() ? &beats : nullptr;
+	const bool isDuration = ioInput.Flag();
+	text = sBefore;
+	const bool isWritten = ConvertSamplesToTimecode(text, samples, sampleRate, format, 30, given, isDuration);
+	Require(isWritten == (format != kTimecodeFormat_Beats || given != nullptr), "only missing beats are misuse");
+	Require(isWritten == (text != sBefore), "text is written whole or not at all");
+	RequirePositionInBuffers(text, samples, sampleRate, format, 30, given, isDuration);
 }
 
 // A position below ten hours is written with milliseconds, and read back within one of them.
@@ -78,23 +73,49 @@ void CheckRoundTrip(FuzzInput& ioInput)
 	Require(std::abs(again - samples) <= kSampleRate / 1'000, "decimal time is exact to the millisecond");
 }
 
+// Quarter notes are written with three decimals, milliseconds with one or as six digits, and read back as exactly.
+void CheckCountsRoundTrip(FuzzInput& ioInput)
+{
+	constexpr std::int32_t kSampleRate = 48'000;
+	BeatInfo beats;
+	beats.dTempo = 30 + ioInput.Any<std::uint8_t>();
+	const std::int64_t samples = ioInput.Any<std::uint32_t>() % (36'000u * kSampleRate);
+	UTF16String text;
+	std::int64_t again = -1;
+	ConvertSamplesToTimecode(text, samples, kSampleRate, kTimecodeFormat_Beats, 30, &beats, false);
+	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Beats, kSampleRate, 30, &beats, false);
+	const double perBeat = kSampleRate * 60 / beats.dTempo;
+	Require(std::abs(static_cast<double>(again - samples)) <= perBeat / 1'000 + 1, "beats are exact to the thousandth");
+
+	const std::int64_t few = samples % (99 * kSampleRate);   // with tenths; longer texts have fewer digits
+	ConvertSamplesToTimecode(text, few, kSampleRate, kTimecodeFormat_Milliseconds, 30, nullptr, false);
+	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Milliseconds, kSampleRate, 30, nullptr, false);
+	Require(std::abs(again - few) <= kSampleRate / 10'000 + 1, "milliseconds are exact to the tenth");
+}
+
+// The functions for one format and the one for all agree, and durations are written as positions are.
+void CheckEntries(FuzzInput& ioInput)
+{
+	const auto samples = ioInput.Edge<std::int64_t>();
+	const auto sampleRate = ioInput.Edge<std::int32_t>();
+	const BeatInfo beats = TakeBeats(ioInput);
+	const bool isDuration = ioInput.Flag();
+	UTF16String text, direct;
+	ConvertSamplesToTimecode(text, samples, sampleRate, kTimecodeFormat_Decimal, 30, nullptr, isDuration);
+	ConvertSamplesToDecimalTimecode(direct, samples, sampleRate, false);
+	Require(text == direct, "both writers give the same decimal time");
+	UTF16String whole;
+	ConvertSamplesToDecimalTimecode(whole, samples, sampleRate, true);
+	Require(direct.starts_with(whole), "without its fraction a time is cut short");
+	ConvertSamplesToTimecode(text, samples, sampleRate, kTimecodeFormat_Beats, 30, &beats, isDuration);
+	ConvertSamplesToBeats(direct, samples, sampleRate, beats.dTempo);
+	Require(text == direct, "both writers give the same beats");
+}
+
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	zoncore::debug::SetAssertDialog([](auto&&...) { return false; });
-	FuzzInput input(inData, inSize);
-	switch (input.Below(3))
-	{
-	case 0:
-		CheckReading(input);
-		break;
-	case 1:
-		CheckWriting(input);
-		break;
-	case 2:
-		CheckRoundTrip(input);
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf(
+		{CheckReading, CheckWriting, CheckRoundTrip, CheckCountsRoundTrip, CheckEntries}, inData, inSize);
 }

@@ -1,9 +1,11 @@
 // Film feet and frames: any text, against a reading of its own.
 
-#include "FuzzInput.h"
+#include "Checks.h"
+#include "Numbers.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <algorithm>
+#include <cstdlib>
 #include <iterator>
 
 namespace
@@ -14,6 +16,8 @@ using zoncore::UTF16Char;
 using zoncore::UTF16String;
 using zoncore::UTF16StringView;
 using zonfuzz::FuzzInput;
+using zonfuzz::Numbers;
+using zonfuzz::ReadNumbers;
 using zonfuzz::Require;
 
 // The number that a text begins with, after white space and a sign; 0 for none, the nearest 64-bit value for a larger one.
@@ -64,18 +68,24 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t in
 	FuzzInput input(inData, inSize);
 	const bool is35mm = input.Flag();
 	const TimeDisplay display = is35mm ? kTimeDisplay_35mmFeetFrames : kTimeDisplay_16mmFeetFrames;
+	const std::int32_t perFoot = is35mm ? 16 : 40;
 	const FrameRate rate = input.Flag() ? kFrameRate_Film24 : FrameRate(input.Edge<std::int64_t>());
 	const UTF16String text = input.Text();
 	if (text.empty())
 		return 0;
 	const TickTime time = TimecodeToTime(text, rate, display);
-	Require(time == ReadFeetAndFrames(text, rate, is35mm ? 16 : 40), "feet and frames are read as they stand");
+	Require(time == ReadFeetAndFrames(text, rate, perFoot), "feet and frames are read as they stand");
 
 	const UTF16String written = TimeToTimecode(time, kFrameRate_Film24, display);
 	TickTime aligned = time;
 	aligned.AlignToFrame(kFrameRate_Film24);
 	const std::int64_t frame = aligned.ToFrame64(kFrameRate_Film24);
 	if (frame >= INT32_MIN && frame <= INT32_MAX)
+	{
 		Require(TimecodeToTime(written, kFrameRate_Film24, display) == aligned, "what is written reads back");
+		const std::int64_t magnitude = std::abs(frame);
+		Require(ReadNumbers(written) == Numbers{magnitude / perFoot, magnitude % perFoot}, "feet and what is left");
+		Require((written.front() == '-') == (time < kTime_Zero), "a time before zero has its sign");
+	}
 	return 0;
 }

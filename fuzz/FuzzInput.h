@@ -7,25 +7,12 @@
 #include <bit>
 #include <cstddef>
 #include <cstdint>
-#include <cstdio>
-#include <cstdlib>
-#include <cstring>
 #include <limits>
 #include <string_view>
 #include <type_traits>
 
 namespace zonfuzz
 {
-
-/// Ends the program, for the fuzzer to record the input, when an invariant does not hold.
-inline void Require(
-	bool inCondition, const char* inWhat, const char* inFile = __builtin_FILE(), int inLine = __builtin_LINE())
-{
-	if (inCondition)
-		return;
-	std::fprintf(stderr, "%s:%d: does not hold: %s\n", inFile, inLine, inWhat);
-	std::abort();
-}
 
 /// Reads arguments off a fuzzer's bytes: numbers from the front, text from what is left. Behind the end all bytes are 0.
 class FuzzInput
@@ -82,6 +69,7 @@ public:
 	zoncore::UTF16String Text()
 	{
 		zoncore::UTF16String text;
+		text.reserve(mBytes.size());
 		while (!mBytes.empty())
 		{
 			const auto byte = Any<std::uint8_t>();

@@ -1,6 +1,6 @@
 // Numbers as text and as fractions, against the C library and exact arithmetic.
 
-#include "FuzzInput.h"
+#include "Checks.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
 
@@ -10,7 +10,11 @@
 #include <cerrno>
 #include <climits>
 #include <cmath>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
 #include <string>
+#include <utility>
 
 namespace
 {
@@ -50,41 +54,80 @@ void CheckInteger(const UTF16String& inText, const std::string& inNarrow)
 	Require(value == (isExpected ? expected : 0), "integers have the value that strtoll reads");
 }
 
-void CheckReading(const UTF16String& inText)
+void CheckReading(FuzzInput& ioInput)
 {
-	const std::string narrow = ForTheCLibrary(inText);
-	CheckInteger<int>(inText, narrow);
-	CheckInteger<long long>(inText, narrow);
+	const UTF16String text = ioInput.Text();
+	const std::string narrow = ForTheCLibrary(text);
+	CheckInteger<int>(text, narrow);
+	CheckInteger<long long>(text, narrow);
 	char* end = nullptr;
 	const double expected = std::strtod(narrow.c_str(), &end);
 	double value = 99;
-	Require(StringToNumber(inText, value, 0) == (end != narrow.c_str()), "doubles are taken and refused as by strtod");
+	Require(StringToNumber(text, value, 0) == (end != narrow.c_str()), "doubles are taken and refused as by strtod");
 	Require(IsSame(value, end != narrow.c_str() ? expected : 0), "doubles have the value that strtod reads");
 }
 
-void CheckWriting(double inValue, FuzzInput& ioInput)
+// The text of a number made of what printf writes. Beyond 1,100 decimals a double has zeros only; texts of that many
+// digits are longer than all that are asked for here.
+std::string Expected(double inValue, unsigned long inDigits, unsigned long inDecimals, unsigned inFlags, int inLength)
 {
-	UTF16String text = NumberToString(inValue, 1, 1'074, kNumberFlag_DropTrailingZeros, INT_MAX);
-	double value = 99;
-	const bool isRead = StringToNumber(text, value, 0);
-	Require(isRead == std::isfinite(inValue), "finite doubles can be read back");
-	Require(!isRead || value == inValue, "doubles with all their decimals survive");
+	if (std::isnan(inValue))
+		return "nan";
+	if (std::isinf(inValue))
+		return inValue < 0 ? "-inf" : "inf";
+	char buffer[1'500];
+	std::snprintf(buffer, sizeof buffer, "%.*f", static_cast<int>(std::min(inDecimals, 1'100ul)), std::abs(inValue));
+	std::string text = buffer;
+	const std::size_t wholeDigits = std::min(text.find('.'), text.size());
+	text.insert(0, std::max(std::min(inDigits, 400ul), wholeDigits) - wholeDigits, '0');
+	if ((inFlags & kNumberFlag_DropTrailingZeros) != 0 && text.find('.') != std::string::npos)
+	{
+		text.erase(text.find_last_not_of('0') + 1);
+		text.erase(text.find_last_not_of('.') + 1);
+	}
+	if (inValue < 0 && text.find_first_of("123456789") != std::string::npos)
+		text.insert(0, 1, '-');
+	if (static_cast<std::int64_t>(text.size()) > inLength)
+		std::snprintf(buffer, sizeof buffer, "%g", inValue);
+	return static_cast<std::int64_t>(text.size()) > inLength ? buffer : text;
+}
 
+double TakeDouble(FuzzInput& ioInput)
+{
+	return ioInput.Flag() ? ioInput.Any<double>() : static_cast<double>(ioInput.Edge<std::int64_t>()) / 1'001;
+}
+
+void CheckRoundTrip(FuzzInput& ioInput)
+{
+	const double value = TakeDouble(ioInput);
+	const UTF16String text = NumberToString(value, 1, 1'074, kNumberFlag_DropTrailingZeros, INT_MAX);
+	double again = 99;
+	const bool isRead = StringToNumber(text, again, 0);
+	Require(isRead == std::isfinite(value), "finite doubles can be read back");
+	Require(!isRead || again == value, "doubles with all their decimals survive");
+}
+
+void CheckWriting(FuzzInput& ioInput)
+{
+	const double value = TakeDouble(ioInput);
 	const auto digits = ioInput.Edge<unsigned long>();
 	const auto decimals = ioInput.Edge<unsigned long>();
 	const auto flags = ioInput.Any<unsigned short>();
 	const int length = ioInput.Any<std::int8_t>();
-	text = NumberToString(inValue, digits, decimals, flags, length);
-	if (!std::isfinite(inValue) || (length >= 0 && text.size() <= static_cast<std::size_t>(length) && decimals > 1'100))
-		return;
-	char general[32], fixed[1'500];
-	std::snprintf(general, sizeof general, "%g", inValue);
-	std::snprintf(fixed, sizeof fixed, "%.*f", static_cast<int>(std::min(decimals, 1'100ul)), inValue);
-	const std::string narrow = UTF16to8(text);
-	const bool isPlain = digits <= 1 && flags == 0 && std::strtod(fixed, nullptr) != 0;
-	Require(!isPlain || narrow == fixed || narrow == general, "fixed and general text are those of printf");
-	Require(
-		narrow == general || static_cast<int>(narrow.size()) <= length, "only general text is longer than asked for");
+	Require(UTF16to8(NumberToString(value, digits, decimals, flags, length))
+			== Expected(value, digits, decimals, flags, length),
+		"numbers are written as by printf");
+}
+
+template <class Integer>
+void CheckIntegerText(Integer inValue)
+{
+	const UTF16String text = IntegerToString(inValue);
+	Require(UTF16to8(text) == std::to_string(inValue), "integers are written as by the standard library");
+	long long value = 99;
+	const bool isRead = StringToNumber(text, value, 0);
+	Require(isRead == std::in_range<long long>(inValue), "integers are read where they fit");
+	Require(!isRead || std::cmp_equal(value, inValue), "integers survive");
 }
 
 using Exact = boost::multiprecision::cpp_int;
@@ -97,44 +140,45 @@ Exact Distance(double inValue, std::int64_t inNumerator, std::int64_t inDenomina
 	return abs((mantissa << (47 + exponent)) * inDenominator - (Exact(inNumerator) << 100));
 }
 
-void CheckFraction(double inValue, FuzzInput& ioInput)
+void CheckFraction(FuzzInput& ioInput)
 {
+	const double value = TakeDouble(ioInput);
 	constexpr std::int64_t kLargest = 2'147'483'646;
-	const boost::rational<int> fraction = RationalApproximation(inValue);
+	const boost::rational<int> fraction = RationalApproximation(value);
 	Require(std::abs(static_cast<std::int64_t>(fraction.numerator())) <= kLargest && fraction.denominator() > 0
 			&& fraction.denominator() <= kLargest,
 		"terms are in their range");
-	if (!(std::abs(inValue) > 0x1p-40 && std::abs(inValue) < 0x1p40))
+	if (!(std::abs(value) > 0x1p-40 && std::abs(value) < 0x1p40))
 		return;
 	const std::int64_t denominator = 1 + ioInput.Any<std::uint32_t>() % kLargest;
 	const std::int64_t numerator
-		= std::clamp<std::int64_t>(std::llround(inValue * static_cast<double>(denominator)), -kLargest, kLargest);
-	const Exact distance = Distance(inValue, fraction.numerator(), fraction.denominator());
-	Require(distance * denominator <= Distance(inValue, numerator, denominator) * fraction.denominator(),
+		= std::clamp<std::int64_t>(std::llround(value * static_cast<double>(denominator)), -kLargest, kLargest);
+	const Exact distance = Distance(value, fraction.numerator(), fraction.denominator());
+	Require(distance * denominator <= Distance(value, numerator, denominator) * fraction.denominator(),
 		"no fraction is closer");
 }
 
-void CheckTruncation(double inValue)
+void CheckTruncation(FuzzInput& ioInput)
 {
-	const bool fits64 = inValue >= -0x1p63 && inValue < 0x1p63;
-	Require(TruncateTo<std::int64_t>(inValue) == (fits64 ? static_cast<std::int64_t>(inValue) : INT64_MIN), "64 bits");
-	const bool fits32 = std::trunc(inValue) >= -0x1p31 && std::trunc(inValue) < 0x1p31;
-	Require(TruncateTo<std::int32_t>(inValue) == (fits32 ? static_cast<std::int32_t>(inValue) : INT32_MIN), "32 bits");
+	const double value = TakeDouble(ioInput);
+	const bool fits64 = value >= -0x1p63 && value < 0x1p63;
+	Require(TruncateTo<std::int64_t>(value) == (fits64 ? static_cast<std::int64_t>(value) : INT64_MIN), "64 bits");
+	const bool fits32 = std::trunc(value) >= -0x1p31 && std::trunc(value) < 0x1p31;
+	Require(TruncateTo<std::int32_t>(value) == (fits32 ? static_cast<std::int32_t>(value) : INT32_MIN), "32 bits");
+}
+
+void CheckIntegers(FuzzInput& ioInput)
+{
+	CheckIntegerText(ioInput.Edge<int>());
+	CheckIntegerText(ioInput.Edge<unsigned>());
+	CheckIntegerText(ioInput.Edge<std::int64_t>());
+	CheckIntegerText(ioInput.Edge<std::uint64_t>());
 }
 
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	if (input.Flag())
-	{
-		CheckReading(input.Text());
-		return 0;
-	}
-	const double value = input.Flag() ? input.Any<double>() : static_cast<double>(input.Edge<std::int64_t>()) / 1'001;
-	CheckTruncation(value);
-	CheckFraction(value, input);
-	CheckWriting(value, input);
-	return 0;
+	return zonfuzz::RunOneOf(
+		{CheckReading, CheckWriting, CheckRoundTrip, CheckFraction, CheckTruncation, CheckIntegers}, inData, inSize);
 }

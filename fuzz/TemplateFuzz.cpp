@@ -1,9 +1,14 @@
-// Templates that are filled, and text that is replaced, against a walk character by character.
+// Templates and keys whose placeholders are filled, and text that is replaced, against a walk character by character.
 
-#include "FuzzInput.h"
+#include "BufferChecks.h"
 #include "zoncore/Localizer.h"
 #include "zoncore/StringUtils.h"
 
+#include <algorithm>
+#include <mutex>
+#include <span>
+#include <string>
+#include <string_view>
 #include <vector>
 
 namespace
@@ -12,6 +17,7 @@ namespace
 using namespace zoncore;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
+using zonfuzz::RequireInBuffer;
 
 UTF16String FillStepwise(const UTF16String& inTemplate, const std::vector<UTF16String>& inTexts)
 {
@@ -39,38 +45,89 @@ UTF16String ReplaceStepwise(const UTF16String& inText, const UTF16String& inWhat
 	return text;
 }
 
-// inCount characters off the front of ioText.
-UTF16String Take(UTF16String& ioText, std::size_t inCount)
+// A text cut into pieces at lengths that the input begins with; the last piece is what is left.
+std::vector<UTF16String> TakePieces(FuzzInput& ioInput)
 {
-	const UTF16String taken = ioText.substr(0, inCount);
-	ioText.erase(0, taken.size());
-	return taken;
+	std::vector<std::size_t> lengths(ioInput.Below(12));
+	for (std::size_t& length : lengths)
+		length = ioInput.Below(8);
+	const UTF16String text = ioInput.Text();
+	std::vector<UTF16String> pieces;
+	std::size_t begin = 0;
+	for (const std::size_t length : lengths)
+	{
+		pieces.push_back(text.substr(begin, length));
+		begin += pieces.back().size();
+	}
+	pieces.push_back(text.substr(begin));
+	return pieces;
+}
+
+void CheckFilling(FuzzInput& ioInput)
+{
+	std::vector<UTF16String> texts = TakePieces(ioInput);
+	const UTF16String pattern = texts.back();
+	texts.pop_back();
+	const UTF16String filled = FillPlaceholders(pattern, texts);
+	Require(filled == FillStepwise(pattern, texts), "templates are filled in one pass");
+	RequireInBuffer(filled, [&](std::span<UTF16Char> outText) { return FillPlaceholders(outText, pattern, texts); });
+}
+
+void CheckReplacing(FuzzInput& ioInput)
+{
+	std::vector<UTF16String> texts = TakePieces(ioInput);
+	texts.insert(texts.begin(), 3 - std::min<std::size_t>(texts.size(), 3), UTF16String());
+	const UTF16String &text = texts.back(), &what = texts[0], &with = texts[1];
+	UTF16String replaced = text;
+	utility::ReplaceInString(replaced, what, with);
+	Require(replaced == ReplaceStepwise(text, what, with), "every occurrence is replaced once");
+	UTF16String itself = text;
+	utility::ReplaceInString(itself, itself, with);
+	Require(itself == (text.empty() ? text : with), "text is its own only occurrence");
+	itself = text;
+	utility::ReplaceInString(itself, what, itself);
+	Require(itself == ReplaceStepwise(text, what, text), "text is put into itself as it was");
+}
+
+// What the translator knows for every key below "$$$/known/".
+UTF16String sTranslation;
+
+void InstallTranslator()
+{
+	config::Localizer::Get().SetTranslator(
+		[](std::string_view inKey, UTF16String& outText)
+		{
+			outText = sTranslation;
+			return inKey.starts_with("$$$/known/");
+		});
+}
+
+void CheckKeys(FuzzInput& ioInput)
+{
+	static std::once_flag sIsInstalled;
+	std::call_once(sIsInstalled, InstallTranslator);
+	std::vector<UTF16String> texts = TakePieces(ioInput);
+	sTranslation = texts.back();
+	texts.pop_back();
+	const config::Localizer& localizer = config::Localizer::Get();
+	const std::string english = utility::UTF16to8(sTranslation);
+	const std::string known = "$$$/known/key=English", unknown = "$$$/unknown/key=" + english;
+	Require(localizer.Lookup(known) == sTranslation, "the translation is that of the translator");
+	Require(localizer.Lookup(unknown) == utility::UTF8to16(english), "without one the text is the English one");
+	Require(localizer.Lookup(unknown, english) == utility::UTF8to16(english), "also when it is at hand");
+	for (const std::string& key : {known, unknown})
+		Require(localizer.Lookup(key, texts) == FillStepwise(localizer.Lookup(key), texts), "templates are filled");
+	const std::string anything = utility::UTF16to8(texts.empty() ? sTranslation : texts.front());
+	const std::size_t equals = anything.find('=');
+	Require(anything.starts_with("$$$/known/")
+			|| localizer.Lookup(anything)
+				== utility::UTF8to16(equals == std::string::npos ? "" : anything.substr(equals + 1)),
+		"the English text stands behind the first mark");
 }
 
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	std::vector<std::size_t> lengths(input.Below(12));
-	for (std::size_t& length : lengths)
-		length = input.Below(8);
-	const std::size_t whatLength = input.Below(4);
-	UTF16String pattern = input.Text();
-	std::vector<UTF16String> texts;
-	for (const std::size_t length : lengths)
-		texts.push_back(Take(pattern, length));
-
-	const UTF16String filled = FillPlaceholders(pattern, texts);
-	Require(filled == FillStepwise(pattern, texts), "templates are filled in one pass");
-
-	const UTF16String what = pattern.substr(0, whatLength);
-	const UTF16String with = texts.empty() ? UTF16String() : texts.front();
-	UTF16String replaced = filled;
-	utility::ReplaceInString(replaced, what, with);
-	Require(replaced == ReplaceStepwise(filled, what, with), "every occurrence is replaced once");
-	UTF16String itself = filled;
-	utility::ReplaceInString(itself, itself, itself);
-	Require(itself == filled, "text replaced by itself stays");
-	return 0;
+	return zonfuzz::RunOneOf({CheckFilling, CheckReplacing, CheckKeys}, inData, inSize);
 }

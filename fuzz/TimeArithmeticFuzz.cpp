@@ -1,6 +1,7 @@
 // Arithmetic on times, rates, ratios and time bases with any integers; divisions by 0 are left out, they are faults.
 
-#include "FuzzInput.h"
+#include "BufferChecks.h"
+#include "zoncore/Reciprocal.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
 #include "zonmediatypes/TickTime.h"
@@ -10,6 +11,7 @@
 
 #include <boost/multiprecision/cpp_int.hpp>
 
+#include <algorithm>
 #include <cmath>
 #include <cstdlib>
 
@@ -19,6 +21,7 @@ namespace
 using namespace zonmediatypes;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
+using zonfuzz::RequireInBuffers;
 
 using Exact = boost::multiprecision::cpp_int;
 
@@ -78,10 +81,22 @@ void CheckFrames(FuzzInput& ioInput)
 		Require(ceiling == time && nearest == time, "without a rate nothing is aligned");
 	else
 		Require(nearest >= kTime_Min && nearest <= kTime_Max, "the nearest frame is within a hundred hours");
+	const std::int64_t ticks = time.GetTicks(), frame = rate.GetTicksPerFrame();
+	if (ticks >= 0 && frame > 0 && ticks <= INT64_MAX - frame)
+	{
+		const std::int64_t up = ceiling.GetTicks(), near = nearest.GetTicks();
+		Require(
+			up % frame == 0 && up >= ticks && up - ticks < frame, "the ceiling is the first frame start from there");
+		const std::int64_t distance = near > ticks ? near - ticks : ticks - near;
+		Require(nearest == kTime_Max || (near % frame == 0 && distance <= frame - frame / 2), "the nearest is near");
+	}
 
 	FrameRate calculated;
-	time.CalculateFrameRate(ioInput.Edge<unsigned long long>(), calculated);
-	Require(calculated.GetTicksPerFrame() != 0, "there is no rate without duration");
+	const auto count = ioInput.Edge<unsigned long long>();
+	time.CalculateFrameRate(count, calculated);
+	const std::int64_t divisor = static_cast<std::int64_t>(count);
+	const std::int64_t duration = divisor == 0 ? 0 : Wrapped(Exact(ticks) / divisor);
+	Require(calculated == (duration == 0 ? kFrameRate_Zero : FrameRate(duration)), "frames fill the time");
 }
 
 void CheckRate(FuzzInput& ioInput)
@@ -96,7 +111,9 @@ void CheckRate(FuzzInput& ioInput)
 	static_cast<void>(rate * ioInput.Any<double>());
 	static_cast<void>(rate / ioInput.Any<double>());
 	static_cast<void>(GetFrameRateRatio(rate, TakeRate(ioInput)));
-	Require(!FrameRateDescription(rate).empty(), "every rate has a description");
+	const zoncore::UTF16String description = FrameRateDescription(rate);
+	Require(!description.empty(), "every rate has a description");
+	RequireInBuffers(description, [rate](auto outText) { return FrameRateDescription(outText, rate); });
 	if (rate.GetTicksPerFrame() > 0)
 		Require(
 			FrameRateToRatio(rate) == boost::rational<long long>(kTicksPerSecond, rate.GetTicksPerFrame()), "exact");
@@ -113,9 +130,47 @@ void CheckDisplay(FuzzInput& ioInput)
 	Require(
 		!IsTimeDisplayDropFrame(display) || IsDropFrameApplicableForTimeDisplay(display), "drop frames are applicable");
 	static_cast<void>(TimeDisplayDescription(display));
-	bool isMarked = false;
-	static_cast<void>(MapPulldownFrameTo2997Frame(TickTime(ioInput.Edge<std::int64_t>()), rate,
-		static_cast<PulldownCadence>(ioInput.Edge<std::int32_t>()), isMarked));
+	const FrameRate counted = GetFrameRateForTimeDisplay(display, rate);
+	Require(!IsTimeDisplayDropFrame(display) || counted == kFrameRate_VideoNTSC || counted == kFrameRate_VideoNTSC_HD,
+		"drop frames are those of NTSC");
+	const auto displays = AllTimeDisplays();
+	const bool isDisplay = std::find(displays.begin(), displays.end(), display) != displays.end();
+	Require(isDisplay || (counted == kFrameRate_Zero && !IsTimeDisplayFormatAudio(display)), "others have no rate");
+}
+
+void CheckReciprocal(FuzzInput& ioInput)
+{
+	constexpr std::uint64_t kMost = zoncore::utility::Reciprocal::kMostDividend;
+	const std::uint64_t divisor = ioInput.Edge<std::uint64_t>() % kMost + 1, any = ioInput.Edge<std::uint64_t>();
+	const zoncore::utility::Reciprocal reciprocal(divisor);
+	const std::uint64_t multiple
+		= kMost / divisor == 0 ? 0 : any % (kMost / divisor + 1) * divisor;   // where it is tight
+	for (const std::uint64_t dividend : {any % (kMost + 1), multiple, multiple == 0 ? 0 : multiple - 1, kMost})
+		Require(reciprocal.Divide(dividend) == dividend / divisor, "a multiplication divides");
+}
+
+void CheckPulldown(FuzzInput& ioInput)
+{
+	const TickTime time(ioInput.Edge<std::int64_t>());
+	const FrameRate rate = TakeRate(ioInput);
+	const auto cadence = static_cast<PulldownCadence>(
+		ioInput.Flag() ? static_cast<std::int32_t>(ioInput.Below(11)) : ioInput.Edge<std::int32_t>());
+	bool isMarked = false, isAlsoMarked = true;
+	const TickTime carrier = MapPulldownFrameTo2997Frame(time, rate, cadence, isMarked);
+	Require(!isMarked || cadence < kPulldownCadence_Advanced_WWWSW || cadence > kPulldownCadence_Advanced_WWWWS,
+		"advanced cadences mark nothing");
+	if (cadence < kPulldownCadence_None || cadence > kPulldownCadence_Advanced_WWWWS)
+		Require(MapPulldownFrameTo2997Frame(time, rate, kPulldownCadence_WWSSW, isAlsoMarked) == carrier
+				&& isMarked == isAlsoMarked,
+			"what is no cadence acts as none");
+	const std::int64_t frame = rate.GetTicksPerFrame();
+	const bool isOrdinary = frame >= kTicksPerSecond / 120 && frame <= kTicksPerSecond * 10;
+	if (time < kTime_Min || time > kTime_Max || !isOrdinary)
+		return;
+	Require(carrier.GetTicks() % frame == 0, "a film frame is carried by a whole frame");
+	Require(!isMarked || carrier > kTime_Zero, "nothing is marked at or before the first frame");
+	const double distance = static_cast<double>(carrier.GetTicks() - time.GetTicks());
+	Require(std::abs(distance) <= 2.5 * static_cast<double>(frame), "film and video run alongside");
 }
 
 void CheckRatio(FuzzInput& ioInput)
@@ -171,6 +226,10 @@ void CheckTimeBase(FuzzInput& ioInput)
 	};
 	const Exact ticks = Exact(kTicksPerSecond) * numerator;
 	expect(base->FromTicks(TickTime(value), rounding), denominator, ticks);
+	if (const auto ratio = base->ToRatio())
+		Require(Exact(ratio->mNumerator) * denominator == Exact(numerator) * ratio->mDenominator
+				&& TimeBase::FromRatio(ratio->mNumerator, ratio->mDenominator) == base,
+			"a ratio is kept in lowest terms");
 	const auto time = base->ToTicks(value, rounding);
 	expect(time ? std::optional(time->GetTicks()) : std::nullopt, ticks, denominator);
 }
@@ -179,27 +238,7 @@ void CheckTimeBase(FuzzInput& ioInput)
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	switch (input.Below(6))
-	{
-	case 0:
-		CheckTime(input);
-		break;
-	case 1:
-		CheckFrames(input);
-		break;
-	case 2:
-		CheckRate(input);
-		break;
-	case 3:
-		CheckDisplay(input);
-		break;
-	case 4:
-		CheckRatio(input);
-		break;
-	case 5:
-		CheckTimeBase(input);
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf(
+		{CheckTime, CheckFrames, CheckRate, CheckDisplay, CheckRatio, CheckTimeBase, CheckPulldown, CheckReciprocal},
+		inData, inSize);
 }

@@ -1,10 +1,13 @@
 // Timecode text and ticks: any text at any rate and display, and times that must survive being written and read.
 
-#include "FuzzInput.h"
+#include "BufferChecks.h"
+#include "Numbers.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <algorithm>
-#include <string>
+#include <array>
+#include <span>
+#include <vector>
 
 namespace
 {
@@ -12,8 +15,12 @@ namespace
 using namespace zonmediatypes;
 using zoncore::UTF16Char;
 using zoncore::UTF16String;
+using zoncore::UTF16StringView;
 using zonfuzz::FuzzInput;
+using zonfuzz::Numbers;
+using zonfuzz::ReadNumbers;
 using zonfuzz::Require;
+using zonfuzz::RequireInBuffers;
 
 constexpr std::int64_t kDay = 86'400 * kTicksPerSecond;
 
@@ -42,33 +49,96 @@ bool IsTimecodeText(const UTF16String& inText)
 	return std::all_of(inText.begin() + (hasSign ? 1 : 0), inText.end(), isKnown);
 }
 
-void CheckReading(const UTF16String& inText, FrameRate inRate, TimeDisplay inDisplay)
+// The time of a text that is not feet and frames, read group by group and put together by HMSFToTime.
+TickTime ReadAgain(const UTF16String& inText, FrameRate inRate, TimeDisplay inDisplay)
 {
-	const TickTime time = TimecodeToTime(inText, inRate, inDisplay);
-	Require(
-		TimecodeToTime(inText, inRate, inDisplay, 0xFFFF'FFF7) == time, "only the last-frame flag changes a time read");
-	Require(!inText.empty() || time == kTime_Zero, "empty text is zero");
-	Require(IsTimecodeText(inText) || IsFeet(inDisplay) || time == kTime_Invalid, "other characters are refused");
-	const TickTime end = TimecodeToTime(inText, inRate, inDisplay, kTimecodeFlag_LastFrame);
+	if (inText.empty())
+		return kTime_Zero;
+	const bool isNegative = inText.front() == '-';
+	std::size_t begin = isNegative || inText.front() == '+' ? 1 : 0;
+	const auto isSeparator = [](UTF16Char inChar) { return inChar == ':' || inChar == ';' || inChar == '.'; };
+	const bool isCount = begin < inText.size() && isSeparator(inText[begin]);
+	begin += isCount ? 1 : 0;
+	std::vector<std::uint32_t> groups;   // without the one behind a last separator
+	for (bool isInside = false; const UTF16Char character : UTF16StringView(inText).substr(begin))
+	{
+		const bool isDigit = character >= '0' && character <= '9';
+		if (!isDigit && (!isSeparator(character) || !isInside))
+			return kTime_Invalid;
+		if (isDigit && !isInside)
+			groups.push_back(0);
+		if (isDigit)
+			groups.back() = static_cast<std::uint32_t>(
+				std::min<std::uint64_t>(groups.back() * 10ull + (character - 0x30u), 0xFFFF'FFFF));
+		isInside = isDigit;
+	}
+	if (groups.empty())
+		return kTime_Invalid;
+	if (isSeparator(inText.back()))
+		groups.push_back(0);
+	if (groups.size() > 4 || (inDisplay == kTimeDisplay_Frames && groups.size() > 1))
+		return kTime_Invalid;
+	if (groups.size() == 1 && (isCount || inDisplay == kTimeDisplay_Frames))
+	{
+		TickTime time;
+		time.AddFrames(isNegative ? -std::int64_t{groups[0]} : std::int64_t{groups[0]}, inRate);
+		return time;
+	}
+	const FrameRate rate = inDisplay == kTimeDisplay_Milliseconds ? kFrameRate_Video1000 : inRate;
+	if (groups.size() == 1)
+	{
+		std::uint32_t run = groups[0], frames = 100;
+		for (const std::int64_t perSecond : {100, 1'000, 10'000})
+			frames *= rate.GetTicksPerFrame() < kTicksPerSecond / perSecond ? 10u : 1u;
+		groups = {run / frames / 10'000, run / frames / 100 % 100, run / frames % 100, run % frames};
+	}
+	groups.insert(groups.begin(), 4 - groups.size(), 0);
+	const TimeDisplay chosen = inDisplay == kTimeDisplay_Auto
+		? GetTimeDisplayForFrameRate(inRate, true, false, kTimeDisplay_2997DropTimecode, false)
+		: inDisplay;
+	return HMSFToTime(groups[0], groups[1], groups[2], groups[3], isNegative, rate, chosen);
+}
+
+void CheckReading(FuzzInput& ioInput)
+{
+	const FrameRate rate = TakeRate(ioInput);
+	const TimeDisplay display = TakeDisplay(ioInput);
+	const UTF16String text = ioInput.Text();
+	const TickTime time = TimecodeToTime(text, rate, display);
+	Require(TimecodeToRatioTime(text, rate, display) == TimeToRatioTime(time), "seconds are those of the ticks");
+	Require(TimecodeToTime(text, rate, display, 0xFFFF'FFF7) == time, "only the last-frame flag changes a time read");
+	Require(IsFeet(display) || time == ReadAgain(text, rate, display), "fields are read as they stand");
+	Require(!text.empty() || time == kTime_Zero, "empty text is zero");
+	Require(IsTimecodeText(text) || IsFeet(display) || time == kTime_Invalid, "other characters are refused");
+	const TickTime end = TimecodeToTime(text, rate, display, kTimecodeFlag_LastFrame);
 	TickTime later = time, earlier = time;
-	later.AddFrames(1, inRate);
-	earlier.AddFrames(-1, inRate);
-	Require(end == time ? time == kTime_Invalid || inText.empty() || later == time : end == later || end == earlier,
+	later.AddFrames(1, rate);
+	earlier.AddFrames(-1, rate);
+	Require(end == time ? time == kTime_Invalid || text.empty() || later == time : end == later || end == earlier,
 		"the end of a range is one frame away");
 }
 
-void CheckWriting(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, unsigned inFlags)
+void CheckWriting(FuzzInput& ioInput)
 {
-	const UTF16String text = TimeToTimecode(inTime, inRate, inDisplay, inFlags);
-	Require(text == TimeToTimecode(inTime, inRate, inDisplay, inFlags | 0xFFFF'FFF0), "only the four flags count");
+	const FrameRate rate = TakeRate(ioInput);
+	const TimeDisplay display = TakeDisplay(ioInput);
+	const TickTime time(ioInput.Edge<std::int64_t>());
+	const unsigned flags = ioInput.Any<std::uint8_t>();
+	const UTF16String text = TimeToTimecode(time, rate, display, flags);
+	Require(text == TimeToTimecode(time, rate, display, flags | 0xFFFF'FFF0), "only the four flags count");
 	Require(
 		text.find_first_not_of(UTF16String{'0', '1', '2', '3', '4', '5', '6', '7', '8', '9', ':', ';', '.', '+', '-'})
 			== UTF16String::npos,
 		"text has only digits, separators and signs");
-	Require(!text.empty(), "there is always a text");
+	Require(!text.empty() && text.size() <= kLongestTimecode, "there is always a text, and none is longer");
+	RequireInBuffers(text, [&](auto outText) { return TimeToTimecode(outText, time, rate, display, flags); });
+	const RatioTime seconds = TimeToRatioTime(time);
+	Require(RatioTimeToTimecode(seconds, rate, display, flags)
+			== TimeToTimecode(RatioTimeToTime(seconds), rate, display, flags),
+		"seconds are written as their ticks");
 }
 
-// A time within a day at a rate that its display counts in.
+// A time within a day at a rate that its display counts in; drop-frame labels begin anew 86 ms before a day is over.
 void CheckRoundTrip(FuzzInput& ioInput)
 {
 	const TimeDisplay display = ioInput.OneOf(AllTimeDisplays());
@@ -78,7 +148,7 @@ void CheckRoundTrip(FuzzInput& ioInput)
 	const bool isWholeRate = rate.IsUsable() && kTicksPerSecond % rate.GetTicksPerFrame() == 0;
 	if (!rate.IsUsable() || (display == kTimeDisplay_AudioSamples && !isWholeRate))
 		return;
-	TickTime time(ioInput.Any<std::int64_t>() % kDay);
+	TickTime time(ioInput.Any<std::int64_t>() % (kDay - kTicksPerSecond));
 	const bool isCount = display == kTimeDisplay_Frames || IsFeet(display);
 	if (isCount && time.ToFrame64(rate) != time.ToFrame32(rate))
 		return;   // counts that are read end at 32 bits
@@ -86,39 +156,80 @@ void CheckRoundTrip(FuzzInput& ioInput)
 	const UTF16String text = TimeToTimecode(time, rate, display, trim | kTimecodeFlag_ShowSign);
 	time.AlignToFrame(rate);
 	Require(TimecodeToTime(text, rate, display) == time, "a time that is written reads back as its frame");
-}
-
-void CheckFields(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay)
-{
+	if (!IsHMSFTimeDisplay(display, false))
+		return;
 	unsigned hours = 99, minutes = 99, seconds = 99;
 	unsigned long long frames = 99;
 	bool isNegative = false;
-	TimeToHMSF(hours, minutes, seconds, frames, isNegative, inTime, inRate, inDisplay);
+	TimeToHMSF(hours, minutes, seconds, frames, isNegative, time, rate, display);
+	Require(HMSFToTime(hours, minutes, seconds, frames, isNegative, rate, display) == time, "fields survive");
+	Require(ReadNumbers(TimeToTimecode(time < kTime_Zero ? -time : time, rate, display))
+			== Numbers{hours, minutes, seconds, static_cast<std::int64_t>(frames)},
+		"the text shows the fields");
+}
+
+void CheckFields(FuzzInput& ioInput)
+{
+	const FrameRate rate = TakeRate(ioInput);
+	const TimeDisplay display = TakeDisplay(ioInput);
+	const TickTime time(ioInput.Edge<std::int64_t>());
+	unsigned hours = 99, minutes = 99, seconds = 99;
+	unsigned long long frames = 99;
+	bool isNegative = false;
+	TimeToHMSF(hours, minutes, seconds, frames, isNegative, time, rate, display);
 	Require(hours < 24 && minutes < 60 && seconds < 60, "fields are in their range");
-	static_cast<void>(HMSFToTime(hours, minutes, seconds, frames, isNegative, inRate, inDisplay));
+	static_cast<void>(HMSFToTime(hours, minutes, seconds, frames, isNegative, rate, display));
+	static_cast<void>(HMSFToTime(ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>(),
+		ioInput.Edge<unsigned long long>(), ioInput.Flag(), rate, display));
+}
+
+// Every row of a column is what the function for one gives; the shorter span counts.
+void CheckColumns(FuzzInput& ioInput)
+{
+	const FrameRate rate = TakeRate(ioInput);
+	const TimeDisplay display = TakeDisplay(ioInput);
+	const unsigned flags = ioInput.Any<std::uint8_t>();
+	std::array<TickTime, 4> times;
+	for (TickTime& time : times)
+		time = TickTime(ioInput.Flag() ? ioInput.Edge<std::int64_t>() : ioInput.Any<std::int64_t>() % kDay);
+	const std::size_t rows = ioInput.Below(times.size() + 1), expected = std::min<std::size_t>(rows, 3);
+	const std::span<const TickTime> column = std::span(times).first(rows);
+
+	const TimecodeFields noFields{98, 97, 96, true, 95};
+	std::array<TimecodeFields, 3> fields{noFields, noFields, noFields};
+	std::array<TimecodeText, 3> texts{};
+	Require(TimesToHMSF(fields, column, rate, display) == expected, "the rows are counted");
+	Require(TimesToTimecode(texts, column, rate, display, flags) == expected, "the rows are counted");
+	for (std::size_t i = 0; i < fields.size(); ++i)
+	{
+		TimecodeFields single = noFields;
+		UTF16String text;
+		if (i < expected)
+		{
+			TimeToHMSF(single.mHours, single.mMinutes, single.mSeconds, single.mFrames, single.mNegative, times[i],
+				rate, display);
+			text = TimeToTimecode(times[i], rate, display, flags);
+		}
+		Require(fields[i] == single, "a row has the fields of its time");
+		Require(text == texts[i].GetText(), "a row has the text of its time");
+	}
+
+	std::array<UTF16String, 3> typed{ioInput.Text()};
+	typed[1] = typed[0].substr(typed[0].size() / 2);
+	typed[2] = TimeToTimecode(times[0], rate, display, flags);
+	const std::array<UTF16StringView, 3> views{typed[0], typed[1], typed[2]};
+	constexpr TickTime kBefore(4'711);
+	std::array<TickTime, 3> read{kBefore, kBefore, kBefore};
+	const std::size_t lines = std::min<std::size_t>(rows, views.size());
+	Require(TimecodesToTimes(read, std::span(views).first(lines), rate, display, flags) == lines, "rows are counted");
+	for (std::size_t i = 0; i < read.size(); ++i)
+		Require(read[i] == (i < lines ? TimecodeToTime(views[i], rate, display, flags) : kBefore),
+			"a row has the time of its text");
 }
 
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	if (input.Flag())
-	{
-		CheckRoundTrip(input);
-		return 0;
-	}
-	const FrameRate rate = TakeRate(input);
-	const TimeDisplay display = TakeDisplay(input);
-	if (input.Flag())
-	{
-		const TickTime time(input.Edge<std::int64_t>());
-		CheckWriting(time, rate, display, input.Any<std::uint8_t>());
-		CheckFields(time, rate, display);
-		static_cast<void>(HMSFToTime(input.Edge<unsigned>(), input.Edge<unsigned>(), input.Edge<unsigned>(),
-			input.Edge<unsigned long long>(), input.Flag(), rate, display));
-		return 0;
-	}
-	CheckReading(input.Text(), rate, display);
-	return 0;
+	return zonfuzz::RunOneOf({CheckReading, CheckRoundTrip, CheckWriting, CheckFields, CheckColumns}, inData, inSize);
 }

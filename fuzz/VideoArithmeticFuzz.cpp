@@ -1,6 +1,6 @@
 // Pixel formats of any properties, rectangles and ratios of any integers.
 
-#include "FuzzInput.h"
+#include "Checks.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelAspectRatioUtils.h"
 #include "zonmediatypes/PixelFormatSelection.h"
@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <utility>
 
 namespace
 {
@@ -80,8 +81,29 @@ void CheckSelection(FuzzInput& ioInput)
 	const PixelFormat nearest = SelectNearestSourcePixelFormat(sources, request.mProperties, quality);
 	Require(
 		nearest == kPixelFormat_Invalid || std::count(sources.begin(), sources.end(), nearest) > 0, "a source format");
-	static_cast<void>(SelectNearestPixelFormat(sources, request, destinations, quality, ioInput.Flag()));
-	static_cast<void>(Select4444PixelFormat(request, quality));
+	if (request.mProperties.Kind() != kPixelFormatKind_Any)
+	{
+		const auto rank = [&](const PixelFormat& inSource)
+		{
+			return std::pair(PixelConversionCost(inSource.mProperties, request.mProperties, quality),
+				inSource.mProperties.BitDepth());
+		};
+		const auto best = std::ranges::min_element(sources, {}, rank);
+		const bool isPossible = best != sources.end() && rank(*best).first < kPixelConversionCost_Impossible;
+		Require(nearest == (isPossible ? *best : kPixelFormat_Invalid),
+			"the first of the shallowest of the cheapest is the nearest");
+	}
+	const bool prefersRequest = ioInput.Flag();
+	const PixelFormat selected = SelectNearestPixelFormat(sources, request, destinations, quality, prefersRequest);
+	const bool isAccepted = std::count(destinations.begin(), destinations.end(), request) > 0;
+	Require(!prefersRequest || !isAccepted || selected == request, "what is preferred and accepted is taken");
+	Require(selected == kPixelFormat_Invalid || selected == request
+			|| std::count(sources.begin(), sources.end(), selected) > 0
+			|| std::count(destinations.begin(), destinations.end(), selected) > 0,
+		"a format of somebody's");
+	const PixelFormat working = Select4444PixelFormat(request, quality);
+	Require(!working.mProperties.IsConcrete() || Select4444PixelFormat(working, quality) == working,
+		"a working format is its own");
 	const PixelFormat decompressed = SelectDVDecompressionFormat(request);
 	Require(decompressed == request || (request.mProperties.IsDV() && !decompressed.mProperties.IsCompressed()),
 		"only DV is decompressed");
@@ -95,12 +117,17 @@ void CheckSizes(FuzzInput& ioInput)
 	const std::int64_t size = PixelFormatSize(format, width, height);
 	const std::int64_t row = UncompressedPixelFormatRowBytes(format, width);
 	Require(!isOrdinary || (size >= 0 && row >= 0), "ordinary frames have a size");
+	const PixelFormatProperties properties = format.mProperties;
+	if (properties.IsConcrete() && !properties.IsCompressed())
+		Require(size == row * height && row % 16 == 0, "a frame is its rows, which are padded");
 	int fixedWidth = -1, fixedHeight = -2;
 	FixedSizedFormatDimensions(format, fixedWidth, fixedHeight);
 	Require(format.mProperties.IsDV() ? fixedWidth > 0 && fixedHeight > 0 : fixedWidth == -1 && fixedHeight == -2,
 		"only DV has a size of its own");
-	static_cast<void>(
-		IsRectValidForFormat(format, width, height, {ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>()}));
+	const PixelAspectRatio ratio(ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>());
+	const bool isValid = IsRectValidForFormat(format, width, height, ratio);
+	Require(properties.IsDV() ? !isValid || (width == fixedWidth && height == fixedHeight) : isValid,
+		"only DV demands a size");
 }
 
 void CheckRatios(FuzzInput& ioInput)
@@ -117,6 +144,12 @@ void CheckRatios(FuzzInput& ioInput)
 	const zoncore::RectT<int> first{0, 0, ioInput.Edge<int>(), ioInput.Edge<int>()};
 	const zoncore::RectT<int> second{ioInput.Edge<int>(), 0, ioInput.Edge<int>(), ioInput.Edge<int>()};
 	static_cast<void>(AdjustPixelAspectRatioForNonUniformDownsample(a, first, second));
+	if (second.right > 0 && second.bottom > 0)
+	{
+		const PixelAspectRatio kept = AdjustPixelAspectRatioForNonUniformDownsample(a, second, second);
+		Require(kept.GetNumerator() == a.GetNumerator() && kept.GetDenominator() == a.GetDenominator(),
+			"the same shape keeps the ratio");
+	}
 	const auto square = AdjustPixelAspectRectToSquarePixelRect(second, a);
 	Require(
 		square.left == second.left && square.top == second.top && square.bottom == second.bottom, "only widths change");
@@ -132,21 +165,5 @@ void CheckRatios(FuzzInput& ioInput)
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
-	FuzzInput input(inData, inSize);
-	switch (input.Below(4))
-	{
-	case 0:
-		CheckProperties(input);
-		break;
-	case 1:
-		CheckSelection(input);
-		break;
-	case 2:
-		CheckSizes(input);
-		break;
-	case 3:
-		CheckRatios(input);
-		break;
-	}
-	return 0;
+	return zonfuzz::RunOneOf({CheckProperties, CheckSelection, CheckSizes, CheckRatios}, inData, inSize);
 }

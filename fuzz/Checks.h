@@ -1,0 +1,35 @@
+#pragma once
+
+#include "FuzzInput.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+
+namespace zonfuzz
+{
+
+/// Ends the program, for the fuzzer to record the input, when an invariant does not hold.
+inline void Require(
+	bool inCondition, const char* inWhat, const char* inFile = __builtin_FILE(), int inLine = __builtin_LINE())
+{
+	if (inCondition)
+		return;
+	std::fprintf(stderr, "%s:%d: does not hold: %s\n", inFile, inLine, inWhat);
+	std::abort();
+}
+
+/// A target is a list of checks. Each takes its arguments off the input and requires what must hold for them.
+using Check = void (*)(FuzzInput& ioInput);
+
+/// Runs the check that the first byte chooses on the bytes behind it. Returns what the fuzzer expects of a target.
+template <std::size_t inCount>
+int RunOneOf(const Check (&inChecks)[inCount], const std::uint8_t* inData, std::size_t inSize)
+{
+	FuzzInput input(inData, inSize);
+	inChecks[input.Below(inCount)](input);
+	return 0;
+}
+
+}   // namespace zonfuzz
