@@ -1,6 +1,6 @@
 #pragma once
 
-// The labels as they are required, and layouts written as text; for the tests of every audio area.
+// What is required of the labels, and layouts written as text; for the tests of every audio area.
 
 #include "zonmediatypes/AudioChannelLayout.h"
 
@@ -16,53 +16,55 @@ namespace zonmediatypes
 struct RequiredLabel
 {
 	AudioChannelLabel mLabel;
-	int mValue;
 	std::string_view mName;
+	int mValue;
 	std::string_view mAbbreviation;
-	std::string_view mEnglish;
-	std::string_view mMnemonic;
+	std::array<int, 3> mPosition;   // to the right, up, to the front
+	std::string_view mPartners;     // left-right, front-back, top-middle, top-bottom, bottom-middle
 };
 
 // clang-format off
+#define LABEL(inName, ...) RequiredLabel{kAudioChannelLabel_##inName, #inName, __VA_ARGS__}
 inline constexpr auto kRequiredLabels = std::to_array<RequiredLabel>({
-	{kAudioChannelLabel_Discrete, 0, "Discrete", "*", "Mono", "&Mono"},
-	{kAudioChannelLabel_FrontLeft, 100, "FrontLeft", "L", "Left", "&Left"},
-	{kAudioChannelLabel_FrontRight, 101, "FrontRight", "R", "Right", "&Right"},
-	{kAudioChannelLabel_FrontCenter, 102, "FrontCenter", "C", "Center", "&Center"},
-	{kAudioChannelLabel_LowFrequency, 103, "LowFrequency", "LFE", "Low Frequency Effects", "Low Fre&quency Effects"},
-	{kAudioChannelLabel_BackLeft, 104, "BackLeft", "Ls", "Left Surround", "L&eft Surround"},
-	{kAudioChannelLabel_BackRight, 105, "BackRight", "Rs", "Right Surround", "Ri&ght Surround"},
-	{kAudioChannelLabel_BackCenter, 106, "BackCenter", "Cs", "Center Surround", "Ce&nter Surround"},
-	{kAudioChannelLabel_FrontLeftOfCenter, 107, "FrontLeftOfCenter", "Lc", "Left Center", "&Left Center"},
-	{kAudioChannelLabel_FrontRightOfCenter, 108, "FrontRightOfCenter", "Rc", "Right Center", "&Right Center"},
-	{kAudioChannelLabel_SideLeft, 109, "SideLeft", "Lsd", "Left Surround Direct", "Left Surround &Direct"},
-	{kAudioChannelLabel_SideRight, 110, "SideRight", "Rsd", "Right Surround Direct", "Right Surround &Direct"},
-	{kAudioChannelLabel_TopCenter, 111, "TopCenter", "Ts", "Top Center Surround", "Top Center S&urround"},
-	{kAudioChannelLabel_TopFrontLeft, 112, "TopFrontLeft", "Vhl", "Vertical Height Left", "Vertical Height &Left"},
-	{kAudioChannelLabel_TopFrontRight, 113, "TopFrontRight", "Vhr", "Vertical Height Right", "Vertical Height &Right"},
-	{kAudioChannelLabel_TopFrontCenter, 114, "TopFrontCenter", "Vhc", "Vertical Height Center", "Vertical Height &Center"},
-	{kAudioChannelLabel_TopBackLeft, 115, "TopBackLeft", "Tbl", "Top Back Left", "Top Back L&eft"},
-	{kAudioChannelLabel_TopBackRight, 116, "TopBackRight", "Tbr", "Top Back Right", "Top Back Ri&ght"},
-	{kAudioChannelLabel_TopBackCenter, 117, "TopBackCenter", "Tbc", "Top Back Center", "Top Back &Center"},
-	{kAudioChannelLabel_FrontLeftWide, 118, "FrontLeftWide", "Lw", "Left Wide", "Left W&ide"},
-	{kAudioChannelLabel_FrontRightWide, 119, "FrontRightWide", "Rw", "Right Wide", "Right Wi&de"},
-	{kAudioChannelLabel_LeftHeight, 127, "LeftHeight", "Tsl", "Top Side Left", "Top Side Le&ft"},
-	{kAudioChannelLabel_RightHeight, 128, "RightHeight", "Tsr", "Top Side Right", "Top Side Rig&ht"},
-	{kAudioChannelLabel_RearSurroundLeft, 129, "RearSurroundLeft", "Rls", "Rear Surround Left", "Rear Surround &Left"},
-	{kAudioChannelLabel_RearSurroundRight, 130, "RearSurroundRight", "Rrs", "Rear Surround Right", "Rear Surround &Right"},
-	{kAudioChannelLabel_LFE2, 131, "LFE2", "LFE2", "Low Frequency Effects 2", "Low Frequency Effects &2"},
-	{kAudioChannelLabel_LeftTotal, 132, "LeftTotal", "Lt", "Left Total", "Left &Total"},
-	{kAudioChannelLabel_RightTotal, 133, "RightTotal", "Rt", "Right Total", "Right T&otal"},
-	{kAudioChannelLabel_AmbisonicsW, 134, "AmbisonicsW", "W", "Ambisonics W", "Ambisonics &W"},
-	{kAudioChannelLabel_AmbisonicsX, 135, "AmbisonicsX", "X", "Ambisonics X", "Ambisonics &X"},
-	{kAudioChannelLabel_AmbisonicsY, 136, "AmbisonicsY", "Y", "Ambisonics Y", "Ambisonics &Y"},
-	{kAudioChannelLabel_AmbisonicsZ, 137, "AmbisonicsZ", "Z", "Ambisonics Z", "Ambisonics &Z"},
-	{kAudioChannelLabel_BottomFrontLeft, 138, "BottomFrontLeft", "Bfl", "Bottom Front Left", "&Bottom Front Left"},
-	{kAudioChannelLabel_BottomFrontCenter, 139, "BottomFrontCenter", "Bfc", "Bottom Front Center", "B&ottom Front Center"},
-	{kAudioChannelLabel_BottomFrontRight, 140, "BottomFrontRight", "Bfr", "Bottom Front Right", "Bo&ttom Front Right"},
-	{kAudioChannelLabel_ProximityLeft, 141, "ProximityLeft", "Pl", "Proximity Left", "&Proximity Left"},
-	{kAudioChannelLabel_ProximityRight, 142, "ProximityRight", "Pr", "Proximity Right", "Pro&ximity Right"},
+	LABEL(Discrete,             0, "*",     { 0,  0,  0}, "* * * * *"),
+	LABEL(FrontLeft,          100, "L",     {-2,  0,  2}, "R Ls Vhl * Bfl"),
+	LABEL(FrontRight,         101, "R",     { 2,  0,  2}, "L Rs R * Bfr"),
+	LABEL(FrontCenter,        102, "C",     { 0,  0,  2}, "* Cs Vhc * Bfc"),
+	LABEL(LowFrequency,       103, "LFE",   { 0,  0,  0}, "LFE2 * * * *"),
+	LABEL(BackLeft,           104, "Ls",    {-2,  0, -2}, "Rs L Tbl * *"),
+	LABEL(BackRight,          105, "Rs",    { 2,  0, -2}, "Ls R Tbr * *"),
+	LABEL(BackCenter,         106, "Cs",    { 0,  0, -2}, "* C Tbc * *"),
+	LABEL(FrontLeftOfCenter,  107, "Lc",    {-1,  0,  2}, "Rc Rls * * *"),
+	LABEL(FrontRightOfCenter, 108, "Rc",    { 1,  0,  2}, "Lc Rrs * * *"),
+	LABEL(SideLeft,           109, "Lsd",   {-2,  0,  0}, "Rsd * * * *"),
+	LABEL(SideRight,          110, "Rsd",   { 2,  0,  0}, "Lsd * * * *"),
+	LABEL(TopCenter,          111, "Ts",    { 0,  2,  0}, "* * * * *"),
+	LABEL(TopFrontLeft,       112, "Vhl",   {-2,  2,  2}, "Vhr Tbl L Bfl *"),
+	LABEL(TopFrontRight,      113, "Vhr",   { 2,  2,  2}, "Vhl Tbr R Bfr *"),
+	LABEL(TopFrontCenter,     114, "Vhc",   { 0,  2,  2}, "* Tbc C Bfc *"),
+	LABEL(TopBackLeft,        115, "Tbl",   {-2,  2, -2}, "Tbr Vhl Ls * *"),
+	LABEL(TopBackRight,       116, "Tbr",   { 2,  2, -2}, "Tbl Vhr Rs * *"),
+	LABEL(TopBackCenter,      117, "Tbc",   { 0,  2, -2}, "* Vhc Cs * *"),
+	LABEL(FrontLeftWide,      118, "Lw",    {-2,  0,  2}, "Rw * * * *"),
+	LABEL(FrontRightWide,     119, "Rw",    { 2,  0,  2}, "Lw * * * *"),
+	LABEL(LeftHeight,         127, "Tsl",   {-2,  2,  0}, "Tsr * * * *"),
+	LABEL(RightHeight,        128, "Tsr",   { 2,  2,  0}, "Tsl * * * *"),
+	LABEL(RearSurroundLeft,   129, "Rls",   {-2,  0, -2}, "Rrs Lc * * *"),
+	LABEL(RearSurroundRight,  130, "Rrs",   { 2,  0, -2}, "Rls Rc * * *"),
+	LABEL(LFE2,               131, "LFE2",  { 0,  0,  0}, "LFE * * * *"),
+	LABEL(LeftTotal,          132, "Lt",    {-2,  0,  0}, "Rt * * * *"),
+	LABEL(RightTotal,         133, "Rt",    { 2,  0,  0}, "Lt * * * *"),
+	LABEL(AmbisonicsW,        134, "W",     { 0,  0,  0}, "* * * * *"),
+	LABEL(AmbisonicsX,        135, "X",     {-2,  0,  0}, "* * * * *"),
+	LABEL(AmbisonicsY,        136, "Y",     { 0,  2,  0}, "* * * * *"),
+	LABEL(AmbisonicsZ,        137, "Z",     { 0,  0,  2}, "* * * * *"),
+	LABEL(BottomFrontLeft,    138, "Bfl",   {-2, -2,  2}, "Bfr * * Vhl L"),
+	LABEL(BottomFrontCenter,  139, "Bfc",   { 0, -2,  2}, "* * * Vhc C"),
+	LABEL(BottomFrontRight,   140, "Bfr",   { 2, -2,  2}, "Bfl * * R R"),
+	LABEL(ProximityLeft,      141, "Pl",    {-1,  0,  0}, "Pr * * * *"),
+	LABEL(ProximityRight,     142, "Pr",    { 1,  0,  0}, "Pl * * * *"),
 });
+#undef LABEL
 // clang-format on
 
 inline AudioChannelLabel LabelByAbbreviation(std::string_view inAbbreviation)

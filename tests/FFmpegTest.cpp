@@ -4,33 +4,24 @@
 
 #include <limits>
 #include <optional>
-#include <stdexcept>
 #include <string>
-#include <vector>
+#include <utility>
 
 #if ZON_HAS_LIBAVUTIL
 	#include "zonmediatypes/interop/FFmpeg.h"
 #endif
 
-namespace zonmediatypes
-{
 namespace
 {
+
+using namespace zonmediatypes;
 
 #if ZON_HAS_LIBAVUTIL
 
 // ---- Time ------------------------------------------------------------------------------------------------------------
 
-std::optional<FrameRate> RateOf(int inNumerator, int inDenominator)
+TEST(FFmpegTime, ConvertsRatesBothWays)
 {
-	return ToFrameRate({inNumerator, inDenominator});
-}
-
-TEST(FFmpegTime, ConvertsTheNamedRatesBothWays)
-{
-	EXPECT_EQ(RateOf(30'000, 1'001), kFrameRate_VideoNTSC);
-	EXPECT_EQ(RateOf(50, 2), kFrameRate_VideoPAL);
-	EXPECT_EQ(RateOf(0, 1), kFrameRate_Zero);
 	for (const FrameRate rate : AllFrameRates())
 	{
 		const auto ratio = ToAVRational(rate);
@@ -39,27 +30,19 @@ TEST(FFmpegTime, ConvertsTheNamedRatesBothWays)
 		EXPECT_NEAR(av_q2d(*ratio),
 			rate == kFrameRate_Zero ? 0.0 : 254'016'000'000.0 / static_cast<double>(rate.GetTicksPerFrame()), 1e-6);
 	}
-}
-
-TEST(FFmpegTime, HasNoCounterpartForWhatIsNoRate)
-{
-	EXPECT_EQ(RateOf(-25, 1), std::nullopt);
-	EXPECT_EQ(RateOf(25, -1), std::nullopt);
-	EXPECT_EQ(RateOf(25, 0), std::nullopt);
-	EXPECT_EQ(RateOf(0, 0), std::nullopt);
-	EXPECT_EQ(RateOf(2'997, 100), std::nullopt) << "no whole number of ticks";
-	EXPECT_FALSE(ToAVRational(FrameRate(0)).has_value());
-	EXPECT_FALSE(ToAVRational(FrameRate(-5)).has_value());
-	EXPECT_FALSE(ToAVRational(FrameRate(10'594'583'999)).has_value()) << "a term beyond 32 bits";
+	EXPECT_EQ(ToFrameRate({50, 2}), kFrameRate_VideoPAL);
+	// No rates, no whole number of ticks, a term beyond 32 bits
+	for (const AVRational none : {AVRational{-25, 1}, {25, -1}, {25, 0}, {0, 0}, {2'997, 100}})
+		EXPECT_EQ(ToFrameRate(none), std::nullopt);
+	for (const std::int64_t duration : {0LL, -5LL, 10'594'583'999LL})
+		EXPECT_FALSE(ToAVRational(FrameRate(duration)).has_value());
 	EXPECT_FALSE(ToTimeBase({1, 0}).has_value());
 	EXPECT_FALSE(ToTimeBase({-1, 25}).has_value());
 }
 
 TEST(FFmpegTime, RescalesTimestampsAsAvRescaleDoes)
 {
-	constexpr AVRational kNanoseconds{1, 1'000'000'000};
-	for (const AVRational base :
-		{AVRational{1, 90'000}, AVRational{1'001, 30'000}, AVRational{2, 44'100}, AVRational{7, 30}, kNanoseconds})
+	for (const AVRational base : {AVRational{1, 90'000}, {1'001, 30'000}, {2, 44'100}, {7, 30}, {1, 1'000'000'000}})
 	{
 		const auto reduced = ToAVRational(ToTimeBase(base).value());
 		ASSERT_TRUE(reduced.has_value());
@@ -86,72 +69,56 @@ TEST(FFmpegTime, MarksWhatHasNoTimestamp)
 
 // ---- Audio -----------------------------------------------------------------------------------------------------------
 
-// A layout by libavutil's own name for it.
-class PeerLayout
+struct PeerLayout : AVChannelLayout
 {
-public:
-	explicit PeerLayout(const char* inName)
-	{
-		if (av_channel_layout_from_string(&mLayout, inName) < 0)
-			throw std::invalid_argument(inName);
-	}
-	explicit PeerLayout(const AudioChannelLayout& inLayout) : mLayout(ToAVChannelLayout(inLayout)) {}
+	explicit PeerLayout(const AVChannelLayout& inLayout) : AVChannelLayout(inLayout) {}
 	PeerLayout(const PeerLayout&) = delete;
 	PeerLayout& operator=(const PeerLayout&) = delete;
-	~PeerLayout() { av_channel_layout_uninit(&mLayout); }
-
-	const AVChannelLayout& Get() const { return mLayout; }
-
-	std::string Name() const
-	{
-		std::string name(1'000, 0);
-		av_channel_layout_describe(&mLayout, name.data(), name.size());
-		return name.c_str();
-	}
-
-private:
-	AVChannelLayout mLayout{};
+	~PeerLayout() { av_channel_layout_uninit(this); }
 };
 
-struct PeerCase
+// By libavutil's own name.
+PeerLayout PeerNamed(const char* inName)
 {
-	const char* mName;
-	const char* mLabels;
-};
+	AVChannelLayout layout{};
+	EXPECT_GE(av_channel_layout_from_string(&layout, inName), 0) << inName;
+	return PeerLayout(layout);
+}
+
+std::string NameOf(const AVChannelLayout& inLayout)
+{
+	std::string name(1'000, 0);
+	av_channel_layout_describe(&inLayout, name.data(), name.size());
+	return name.c_str();
+}
+
+using Rows = std::initializer_list<std::pair<const char*, const char*>>;
 
 TEST(FFmpegChannelLayout, IsReadByTheRolesOfItsSpeakers)
 {
-	const std::vector<PeerCase> cases = {
-		{"mono", "*"},
-		{"stereo", "L R"},
-		{"3.0", "L R C"},
-		{"2.1", "L R LFE"},
-		{"4.0", "L R C Cs"},
-		{"quad", "L R Ls Rs"},
-		{"quad(side)", "L R Ls Rs"},
-		{"5.0", "L R C Ls Rs"},
-		{"5.1", "L R C LFE Ls Rs"},
-		{"5.1(side)", "L R C LFE Ls Rs"},
-		{"6.1", "L R C LFE Cs Ls Rs"},
-		{"6.1(back)", "L R C LFE Ls Rs Cs"},
-		{"7.1", "L R C LFE Rls Rrs Ls Rs"},
-		{"7.1(wide)", "L R C LFE Ls Rs Lc Rc"},
-		{"7.1(wide-side)", "L R C LFE Lc Rc Ls Rs"},
-		{"downmix", "Lt Rt"},
-		{"22.2", "L R C LFE Rls Rrs Lc Rc Cs Ls Rs Ts Vhl Vhc Vhr Tbl Tbc Tbr LFE2 Tsl Tsr Bfc Bfl Bfr"},
-		{"WL+WR+SDL+SDR", "Lw Rw Lsd Rsd"},
-		{"2 channels", "* *"},
-		{"1 channels", "*"},
-		{"ambisonic 1", "* * * *"},
-		{"ambisonic 1+stereo", "* * * * L R"},
-		{"LFE+FC+FL", "LFE C L"},
-		{"BL+SL", "Rls Ls"},
-		{"BR", "Rs"},
-		{"FL", "L"},
-		{"USR62+FL", "* L"},
-	};
-	for (const PeerCase& test : cases)
-		EXPECT_EQ(ToAudioChannelLayout(PeerLayout(test.mName).Get()), ReadLayout(test.mLabels)) << test.mName;
+	for (const auto& [name, labels] : Rows{
+			 {"mono", "*"},
+			 {"4.0", "L R C Cs"},
+			 {"quad", "L R Ls Rs"},
+			 {"5.1", "L R C LFE Ls Rs"},
+			 {"5.1(side)", "L R C LFE Ls Rs"},
+			 {"6.1", "L R C LFE Cs Ls Rs"},
+			 {"6.1(back)", "L R C LFE Ls Rs Cs"},
+			 {"7.1", "L R C LFE Rls Rrs Ls Rs"},
+			 {"7.1(wide)", "L R C LFE Ls Rs Lc Rc"},
+			 {"7.1(wide-side)", "L R C LFE Lc Rc Ls Rs"},
+			 {"downmix", "Lt Rt"},
+			 {"22.2", "L R C LFE Rls Rrs Lc Rc Cs Ls Rs Ts Vhl Vhc Vhr Tbl Tbc Tbr LFE2 Tsl Tsr Bfc Bfl Bfr"},
+			 {"WL+WR+SDL+SDR", "Lw Rw Lsd Rsd"},
+			 {"2 channels", "* *"},
+			 {"ambisonic 1", "* * * *"},
+			 {"ambisonic 1+stereo", "* * * * L R"},
+			 {"LFE+FC+FL", "LFE C L"},
+			 {"BL+SL", "Rls Ls"},
+			 {"BR", "Rs"},
+			 {"USR62+FL", "* L"},
+		 })
+		EXPECT_EQ(ToAudioChannelLayout(PeerNamed(name)), ReadLayout(labels)) << name;
 	EXPECT_EQ(ToAudioChannelLayout(AVChannelLayout{}), AudioChannelLayout());
 	AVChannelLayout broken{};
 	broken.nb_channels = -2;
@@ -160,40 +127,31 @@ TEST(FFmpegChannelLayout, IsReadByTheRolesOfItsSpeakers)
 
 TEST(FFmpegChannelLayout, IsMadeInItsNativeOrderWherePossible)
 {
-	const std::vector<PeerCase> cases = {
-		{"mono", "*"},
-		{"mono", "C"},
-		{"stereo", "L R"},
-		{"quad", "L R Ls Rs"},
-		{"5.1", "L R C LFE Ls Rs"},
-		{"6.1(back)", "L R C LFE Ls Rs Cs"},
-		{"7.1", "L R C LFE Rls Rrs Ls Rs"},
-		{"7.1(wide)", "L R C LFE Ls Rs Lc Rc"},
-		{"downmix", "Lt Rt"},
-		{"3 channels", "* * *"},
-		{"3 channels (FR+FL+FC)", "R L C"},
-		{"8 channels (FL+FR+FC+LFE+SL+SR+BL+BR)", "L R C LFE Ls Rs Rls Rrs"},
-		{"2 channels (FL+FL)", "L L"},
-	};
-	for (const PeerCase& test : cases)
+	for (const auto& [name, labels] : Rows{
+			 {"mono", "*"},
+			 {"mono", "C"},
+			 {"stereo", "L R"},
+			 {"quad", "L R Ls Rs"},
+			 {"5.1", "L R C LFE Ls Rs"},
+			 {"6.1(back)", "L R C LFE Ls Rs Cs"},
+			 {"7.1", "L R C LFE Rls Rrs Ls Rs"},
+			 {"7.1(wide)", "L R C LFE Ls Rs Lc Rc"},
+			 {"downmix", "Lt Rt"},
+			 {"3 channels", "* * *"},
+			 {"3 channels (FR+FL+FC)", "R L C"},
+			 {"8 channels (FL+FR+FC+LFE+SL+SR+BL+BR)", "L R C LFE Ls Rs Rls Rrs"},
+			 {"2 channels (FL+FL)", "L L"},
+		 })
 	{
-		const PeerLayout layout(ReadLayout(test.mLabels));
-		EXPECT_EQ(layout.Name(), test.mName);
-		EXPECT_TRUE(av_channel_layout_check(&layout.Get()));
+		const PeerLayout layout(ToAVChannelLayout(ReadLayout(labels)));
+		EXPECT_EQ(NameOf(layout), name);
+		EXPECT_TRUE(av_channel_layout_check(&layout));
 	}
-}
-
-TEST(FFmpegChannelLayout, HasUnknownChannelsForDiscreteOnes)
-{
-	const PeerLayout layout(ReadLayout("L *"));
-	EXPECT_EQ(av_channel_layout_channel_from_index(&layout.Get(), 0), AV_CHAN_FRONT_LEFT);
-	EXPECT_EQ(av_channel_layout_channel_from_index(&layout.Get(), 1), AV_CHAN_UNKNOWN);
-}
-
-TEST(FFmpegChannelLayout, IsEmptyWhereALabelHasNoCounterpart)
-{
-	for (const char* labels : {"", "W X Y Z", "L R Pl Pr", "L 5", "-1"})
-		EXPECT_EQ(PeerLayout(ReadLayout(labels)).Get().nb_channels, 0) << labels;
+	const PeerLayout half(ToAVChannelLayout(ReadLayout("L *")));
+	EXPECT_EQ(av_channel_layout_channel_from_index(&half, 0), AV_CHAN_FRONT_LEFT);
+	EXPECT_EQ(av_channel_layout_channel_from_index(&half, 1), AV_CHAN_UNKNOWN);
+	for (const char* const labels : {"", "W X Y Z", "L R Pl Pr", "L 5", "-1"})   // a label without a counterpart
+		EXPECT_EQ(ToAVChannelLayout(ReadLayout(labels)).nb_channels, 0) << labels;
 }
 
 TEST(FFmpegChannelLayout, KeepsEveryLayoutOfTheCatalogueThatHasACounterpart)
@@ -202,12 +160,11 @@ TEST(FFmpegChannelLayout, KeepsEveryLayoutOfTheCatalogueThatHasACounterpart)
 	for (const NamedChannelLayout& named : AllChannelLayouts())
 	{
 		const AudioChannelLayout layout(named.mLabels.begin(), named.mLabels.end());
-		const PeerLayout peer(layout);
-		converted += peer.Get().nb_channels != 0;
-		if (peer.Get().nb_channels != 0)
-		{
-			EXPECT_EQ(ToAudioChannelLayout(peer.Get()), layout) << named.mName;
-		}
+		const PeerLayout peer(ToAVChannelLayout(layout));
+		if (peer.nb_channels == 0)
+			continue;
+		++converted;
+		EXPECT_EQ(ToAudioChannelLayout(peer), layout) << named.mName;
 	}
 	EXPECT_EQ(converted, 87);   // all but B-format and the one with proximity speakers
 }
@@ -222,4 +179,3 @@ TEST(FFmpeg, IsNotInstalled)
 #endif
 
 }   // namespace
-}   // namespace zonmediatypes

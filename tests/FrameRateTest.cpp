@@ -5,7 +5,6 @@
 
 #include <gtest/gtest.h>
 
-#include <array>
 #include <cmath>
 #include <csignal>
 #include <iomanip>
@@ -21,41 +20,6 @@ namespace
 constexpr std::int64_t kMost = std::numeric_limits<std::int64_t>::max();
 constexpr std::int64_t kLeast = std::numeric_limits<std::int64_t>::min();
 
-struct NamedRate
-{
-	FrameRate mRate;
-	std::int64_t mTicksPerFrame;
-	const char* mText;
-};
-
-constexpr auto sRates = std::to_array<NamedRate>({
-	{kFrameRate_Video10, 25'401'600'000, "10"},
-	{kFrameRate_Video12, 21'168'000'000, "12"},
-	{kFrameRate_Video12_5, 20'321'280'000, "12.5"},
-	{kFrameRate_Video15, 16'934'400'000, "15"},
-	{kFrameRate_23976, 10'594'584'000, "23.976"},
-	{kFrameRate_Film24, 10'584'000'000, "24"},
-	{kFrameRate_VideoPAL, 10'160'640'000, "25"},
-	{kFrameRate_VideoNTSC, 8'475'667'200, "29.97"},
-	{kFrameRate_Video30, 8'467'200'000, "30"},
-	{kFrameRate_Film48, 5'292'000'000, "48"},
-	{kFrameRate_VideoPAL_HD, 5'080'320'000, "50"},
-	{kFrameRate_VideoNTSC_HD, 4'237'833'600, "59.94"},
-	{kFrameRate_Video60, 4'233'600'000, "60"},
-	{kFrameRate_Video100, 2'540'160'000, "100"},
-	{kFrameRate_Video1000, 254'016'000, "1000"},
-	{kFrameRate_Audio8000, 31'752'000, "8000"},
-	{kFrameRate_Audio11025, 23'040'000, "11025"},
-	{kFrameRate_Audio22050, 11'520'000, "22050"},
-	{kFrameRate_Audio32000, 7'938'000, "32000"},
-	{kFrameRate_Audio44100, 5'760'000, "44100"},
-	{kFrameRate_Audio48000, 5'292'000, "48000"},
-	{kFrameRate_Audio88200, 2'880'000, "88200"},
-	{kFrameRate_Audio96000, 2'646'000, "96000"},
-	{kFrameRate_Audio192000, 1'323'000, "192000"},
-	{kFrameRate_Zero, 9'223'372'036'854'775'807, "0"},
-});
-
 template <class Char>
 std::basic_string<Char> Text(FrameRate inRate)
 {
@@ -66,12 +30,44 @@ std::basic_string<Char> Text(FrameRate inRate)
 
 TEST(FrameRate, HasTheNamedDurationsAndTheirTexts)
 {
-	ASSERT_EQ(AllFrameRates().size(), sRates.size());
-	for (std::size_t i = 0; i < sRates.size(); ++i)
+	const struct
 	{
-		const auto& [rate, ticks, text] = sRates[i];
+		FrameRate mRate;
+		std::int64_t mTicksPerFrame;
+		const char* mText;
+	} rates[] = {
+		{kFrameRate_Video10, 25'401'600'000, "10"},
+		{kFrameRate_Video12, 21'168'000'000, "12"},
+		{kFrameRate_Video12_5, 20'321'280'000, "12.5"},
+		{kFrameRate_Video15, 16'934'400'000, "15"},
+		{kFrameRate_23976, 10'594'584'000, "23.976"},
+		{kFrameRate_Film24, 10'584'000'000, "24"},
+		{kFrameRate_VideoPAL, 10'160'640'000, "25"},
+		{kFrameRate_VideoNTSC, 8'475'667'200, "29.97"},
+		{kFrameRate_Video30, 8'467'200'000, "30"},
+		{kFrameRate_Film48, 5'292'000'000, "48"},
+		{kFrameRate_VideoPAL_HD, 5'080'320'000, "50"},
+		{kFrameRate_VideoNTSC_HD, 4'237'833'600, "59.94"},
+		{kFrameRate_Video60, 4'233'600'000, "60"},
+		{kFrameRate_Video100, 2'540'160'000, "100"},
+		{kFrameRate_Video1000, 254'016'000, "1000"},
+		{kFrameRate_Audio8000, 31'752'000, "8000"},
+		{kFrameRate_Audio11025, 23'040'000, "11025"},
+		{kFrameRate_Audio22050, 11'520'000, "22050"},
+		{kFrameRate_Audio32000, 7'938'000, "32000"},
+		{kFrameRate_Audio44100, 5'760'000, "44100"},
+		{kFrameRate_Audio48000, 5'292'000, "48000"},
+		{kFrameRate_Audio88200, 2'880'000, "88200"},
+		{kFrameRate_Audio96000, 2'646'000, "96000"},
+		{kFrameRate_Audio192000, 1'323'000, "192000"},
+		{kFrameRate_Zero, 9'223'372'036'854'775'807, "0"},
+	};
+	ASSERT_EQ(AllFrameRates().size(), std::size(rates));
+	const FrameRate* listed = AllFrameRates().data();
+	for (const auto& [rate, ticks, text] : rates)
+	{
 		EXPECT_EQ(rate.GetTicksPerFrame(), ticks);
-		EXPECT_EQ(AllFrameRates()[i], rate);
+		EXPECT_EQ(*listed++, rate);
 		EXPECT_EQ(Text<char>(rate), text);
 		EXPECT_EQ(zoncore::utility::UTF16to8(zoncore::utility::Coercion(rate)), text);
 		const auto bytes = Text<unsigned char>(rate);
@@ -80,10 +76,7 @@ TEST(FrameRate, HasTheNamedDurationsAndTheirTexts)
 	EXPECT_EQ(Text<char>(FrameRate(0)), "inf");
 	EXPECT_EQ(Text<char>(FrameRate(-8'475'667'200)), "-29.97");
 	EXPECT_EQ(Text<char>(FrameRate(10'594'583'999)), "23.98");   // a tick beside the rate with three decimals
-}
 
-TEST(FrameRate, IsPaddedAsText)
-{
 	std::ostringstream narrow;
 	narrow << std::setprecision(1) << std::setfill('*') << std::setw(7) << kFrameRate_23976;
 	EXPECT_EQ(narrow.str(), "*23.976");

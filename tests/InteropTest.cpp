@@ -29,33 +29,27 @@ static_assert(!std::is_default_constructible_v<std::hash<PixelAspectRatio>>);
 
 // ---- Hashes ----------------------------------------------------------------------------------------------------------
 
-TEST(Hashes, AreEqualForEqualValuesAndDifferByField)
+TEST(Hashes, DifferByEveryFieldAndServeAsKeys)
 {
-	EXPECT_EQ(Hash(kFrameRate_VideoNTSC * 2), Hash(kFrameRate_VideoNTSC_HD));
-	const std::vector<RectT<int>> rects{{1, 2, 3, 4}, {2, 1, 3, 4}, {1, 2, 4, 3}, {1, 2, 3, 5}, {0, 2, 3, 4}};
-	std::unordered_set<std::size_t> hashes;
-	for (const RectT<int>& rect : rects)
-		hashes.insert(Hash(rect));
-	EXPECT_EQ(hashes.size(), rects.size());
-	EXPECT_NE(Hash(PointT<int>{1, 2}), Hash(PointT<int>{2, 1}));
-	EXPECT_NE(Hash(AudioChannelLayout()), Hash(CreateMultichannelLayout(1)));
-	EXPECT_NE(Hash(CreateMultichannelLayout(2)), Hash(CreateMultichannelLayout(3)));
-	EXPECT_NE(Hash(kPixelFormat_VUYA_4444_8u),
-		Hash(PixelFormat{kPixelFormatFourCC_Any, kPixelFormat_VUYA_4444_8u.mProperties}));
-	EXPECT_NE(Hash(kPixelFormat_VUYA_4444_8u), Hash(PixelFormat{kPixelFormat_VUYA_4444_8u.mName, {}}));
-	EXPECT_NE(Hash(kPixelFormatProperties_Any), Hash(kPixelFormatProperties_Invalid));
-	EXPECT_NE(Hash(zoncore::Flags<unsigned int>(1)), Hash(zoncore::Flags<unsigned int>(2)));
-}
+	const PixelFormat vuya = kPixelFormat_VUYA_4444_8u;
+	const std::vector<std::size_t> differing[] = {
+		{Hash(RectT<int>{1, 2, 3, 4}), Hash(RectT<int>{2, 1, 3, 4}), Hash(RectT<int>{1, 2, 4, 3})},
+		{Hash(PointT<int>{1, 2}), Hash(PointT<int>{2, 1})},
+		{Hash(AudioChannelLayout()), Hash(CreateMultichannelLayout(1)), Hash(CreateMultichannelLayout(2))},
+		{Hash(vuya), Hash(PixelFormat{{}, vuya.mProperties}), Hash(PixelFormat{vuya.mName, {}})},
+		{Hash(kPixelFormatProperties_Any), Hash(kPixelFormatProperties_Invalid)},
+		{Hash(zoncore::Flags<unsigned>(1)), Hash(zoncore::Flags<unsigned>(2))},
+		{Hash(kFrameRate_VideoNTSC), Hash(kFrameRate_VideoNTSC_HD)},
+	};
+	for (const auto& hashes : differing)
+		EXPECT_EQ(std::unordered_set<std::size_t>(hashes.begin(), hashes.end()).size(), hashes.size());
 
-TEST(Hashes, ServeAsKeys)
-{
 	std::unordered_map<AudioChannelLayout, std::string_view> names;
 	for (const NamedChannelLayout& layout : AllChannelLayouts())
 		names.try_emplace(AudioChannelLayout(layout.mLabels.begin(), layout.mLabels.end()), layout.mName);
 	EXPECT_EQ(names.at(CreateVST22_2ChannelLayout()), "VST22_2");
 	EXPECT_EQ(names.count(CreateMultichannelLayout(3)), 0u);
-
-	std::unordered_map<zoncore::UTF16String, int> texts{{FromUTF8("Länge"), 1}, {FromUTF8("L"), 2}};
+	const std::unordered_map<zoncore::UTF16String, int> texts{{FromUTF8("Länge"), 1}, {FromUTF8("L"), 2}};
 	EXPECT_EQ(texts.at(FromUTF8("Länge")), 1);
 }
 
@@ -76,7 +70,7 @@ TEST(Hashes, SpreadTimesThatLieOnFrames)
 
 TEST(Strings, ConvertBothWays)
 {
-	const std::string text = "Länge \xF0\x9D\x84\x9E";   // with a character beyond 16 bits
+	const std::string text = "Länge \U0001D11E";   // with a character beyond 16 bits
 	EXPECT_EQ(ToUTF8(FromUTF8(text)), text);
 	EXPECT_EQ(ToU16String(FromUTF8(text)), u"Länge \U0001D11E");
 	EXPECT_EQ(FromU16String(u"Länge \U0001D11E"), FromUTF8(text));
@@ -133,22 +127,14 @@ TEST(Streams, WriteEveryValue)
 		utility::BeatInfo{
 			.iTicksPerBeat = -1, .dTempo = 92.5, .iBeatsPerBar = 6, .iBeatValue = 8, .dOffsetMilliseconds = 0},
 		"92.5 in 6/8, -1 ticks a beat, from 0 ms");
-}
-
-TEST(Streams, WriteChannelMaps)
-{
 	ChannelMap map = ChannelMap::CreateDefaultChannelMap(2);
-	ExpectText(map, "L -> 0, R -> 1");
 	map.AddChannel(CreateQuadraphonicChannelLayout(), -1);
 	ExpectText(map, "L -> 0, R -> 1, L R Ls Rs -> none");
 	ExpectText(ChannelMap(), "no entries");
-}
 
-TEST(Streams, PadTheWholeText)
-{
-	std::ostringstream stream;
-	stream << std::setw(12) << std::setfill('.') << PointT<int>{1, 2} << std::setw(5) << CreateStereoChannelLayout();
-	EXPECT_EQ(stream.str(), "......(1, 2)..L R");
+	std::ostringstream padded;
+	padded << std::setw(12) << std::setfill('.') << PointT<int>{1, 2} << std::setw(5) << CreateStereoChannelLayout();
+	EXPECT_EQ(padded.str(), "......(1, 2)..L R");
 }
 
 }   // namespace

@@ -1,71 +1,69 @@
 #include "zoncore/MessageCatalogue.h"
-#include "zoncore/Localizer.h"
+
+#include "tests/Allocations.h"
+#include "tests/WithTranslator.h"
 #include "zoncore/StringUtils.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <cstdint>
+#include <filesystem>
+#include <fstream>
 #include <memory>
 #include <string>
 #include <string_view>
+#include <unistd.h>
 #include <utility>
 #include <vector>
 
-namespace zoncore::config
-{
 namespace
 {
+
+using namespace zoncore;
+using namespace zoncore::config;
 
 using testing::HasSubstr;
 using Messages = std::vector<std::pair<std::string, std::string>>;
 
-enum class ByteOrder
+std::string Word(std::size_t inValue, bool inHighestFirst = false)
 {
-	LowestFirst,
-	HighestFirst
-};
-
-void AppendWord(std::string& ioBytes, std::size_t inWord, ByteOrder inOrder)
-{
+	std::string bytes;
 	for (unsigned i = 0; i < 4; ++i)
-		ioBytes.push_back(static_cast<char>(inWord >> 8 * (inOrder == ByteOrder::LowestFirst ? i : 3 - i)));
+		bytes.push_back(static_cast<char>(inValue >> 8 * (inHighestFirst ? 3 - i : i)));
+	return bytes;
 }
 
-// The file of a catalogue with these messages, in this order.
-std::string MakeCatalogue(const Messages& inMessages, ByteOrder inOrder = ByteOrder::LowestFirst)
+// The file of a catalogue with these messages, in this order: seven words, two tables of lengths and offsets, the texts.
+std::string MakeCatalogue(const Messages& inMessages, bool inHighestFirst = false)
 {
-	const std::size_t count = inMessages.size();
-	std::string bytes;
-	for (const std::size_t word : {std::size_t{0x950412DE}, std::size_t{0}, count, std::size_t{28}, 28 + 8 * count,
-			 std::size_t{0}, std::size_t{0}})
-		AppendWord(bytes, word, inOrder);
-	std::size_t offset = 28 + 16 * count;
-	std::string texts;
-	const auto appendEntry = [&](const std::string& inText)
+	const std::size_t tableBytes = 8 * inMessages.size();
+	std::string bytes, texts;
+	for (const std::size_t word : {std::size_t{0x950412DE}, std::size_t{0}, inMessages.size(), std::size_t{28},
+			 28 + tableBytes, std::size_t{0}, std::size_t{0}})
+		bytes += Word(word, inHighestFirst);
+	for (const auto text : {&Messages::value_type::first, &Messages::value_type::second})
 	{
-		AppendWord(bytes, inText.size(), inOrder);
-		AppendWord(bytes, offset + texts.size(), inOrder);
-		texts += inText + '\0';
-	};
-	for (const auto& message : inMessages)
-		appendEntry(message.first);
-	for (const auto& message : inMessages)
-		appendEntry(message.second);
+		for (const auto& message : inMessages)
+		{
+			bytes += Word((message.*text).size(), inHighestFirst)
+				+ Word(28 + 2 * tableBytes + texts.size(), inHighestFirst);
+			texts += message.*text + '\0';
+		}
+	}
 	return bytes + texts;
 }
 
-const std::pair<std::string, std::string> kHeader = {"", "Content-Type: text/plain; charset=UTF-8\n"};
+const Messages::value_type kHeader = {"", "Content-Type: text/plain; charset=UTF-8\n"};
 const Messages kGerman = {kHeader, {"$$$/a/Draft\4Draft", "Entwurf"}, {"$$$/a/Draft2\4Draft", "Entwurf 2"},
 	{"$$$/a/High\4High", "Hoch"}, {"$$$/ab\4", "leer"}, {"Mono", "ohne Kontext"}};
 
 TEST(MessageCatalogue, FindsByPathAndEnglishTextInEitherByteOrder)
 {
-	for (const ByteOrder order : {ByteOrder::LowestFirst, ByteOrder::HighestFirst})
+	for (const bool isHighestFirst : {false, true})
 	{
 		MessageCatalogue catalogue;
 		std::string error;
-		ASSERT_TRUE(catalogue.Parse(MakeCatalogue(kGerman, order), error)) << error;
+		ASSERT_TRUE(catalogue.Parse(MakeCatalogue(kGerman, isHighestFirst), error)) << error;
 		EXPECT_EQ(catalogue.GetSize(), 5u);
 		EXPECT_EQ(catalogue.Find("$$$/a/Draft=Draft"), "Entwurf");
 		EXPECT_EQ(catalogue.Find("$$$/a/Draft2=Draft"), "Entwurf 2");
@@ -84,81 +82,89 @@ TEST(MessageCatalogue, RefusesDamageAndStaysAsItWas)
 	std::string error;
 	ASSERT_TRUE(catalogue.Parse(sound, error));
 
-	const auto withWord = [&](std::size_t inAt, std::size_t inWord)
+	const auto withWord
+		= [&](std::size_t inAt, std::size_t inWord) { return std::string(sound).replace(inAt, 4, Word(inWord)); };
+	EXPECT_TRUE(catalogue.Parse(withWord(4, 0x1FFFF), error));
+	for (const auto& [bytes, complaint] : std::initializer_list<std::pair<std::string, const char*>>{
+			 {"", "too short"},
+			 {sound.substr(0, 27), "too short"},
+			 {"#!" + sound, "magic number"},
+			 {withWord(4, 0x20000), "unknown revision"},
+			 {withWord(8, 0xFFFFFFFF), "a table of messages lies outside"},
+			 {withWord(12, 0xFFFFFFF8), "a table of messages lies outside"},
+			 {withWord(16, sound.size() - 4), "a table of messages lies outside"},
+			 {withWord(28 + 8, 0xFFFFFFFF), "message 1 lies outside"},
+			 {withWord(28 + 12, 0xFFFFFFFF), "message 1 lies outside"},
+			 {withWord(28 + 8, 3), "message 1 lies outside"},   // no zero byte behind the text
+			 {sound.substr(0, sound.size() - 1), "message 5 lies outside"},
+			 {MakeCatalogue({kHeader, {"b", ""}, {"a", ""}}), "message 2 is not in its sorted place"},
+			 {MakeCatalogue({kHeader, {"a", ""}, {"a", ""}}), "sorted"},
+			 {MakeCatalogue({{"", "charset=ISO-8859-1"}, {"a", "b"}}), "charset=UTF-8"},
+			 {MakeCatalogue({{"a", "b"}}), "charset=UTF-8"},
+		 })
 	{
-		std::string bytes = sound;
-		std::string word;
-		AppendWord(word, inWord, ByteOrder::LowestFirst);
-		return bytes.replace(inAt, 4, word);
-	};
-	const std::vector<std::pair<std::string, const char*>> damages = {
-		{"", "too short"},
-		{sound.substr(0, 27), "too short"},
-		{"#!" + sound, "magic number"},
-		{withWord(4, 0x20000), "unknown revision"},
-		{withWord(8, 0xFFFFFFFF), "outside the file"},
-		{withWord(12, 0xFFFFFFF8), "outside the file"},
-		{withWord(16, sound.size() - 4), "outside the file"},
-		{withWord(28 + 8, 0xFFFFFFFF), "message 1 lies outside"},
-		{withWord(28 + 12, 0xFFFFFFFF), "message 1 lies outside"},
-		{withWord(28 + 8, 3), "message 1 lies outside"},   // no zero byte behind the text
-		{sound.substr(0, sound.size() - 1), "outside the file"},
-		{MakeCatalogue({kHeader, {"b", ""}, {"a", ""}}), "sorted"},
-		{MakeCatalogue({kHeader, {"a", ""}, {"a", ""}}), "sorted"},
-		{MakeCatalogue({{"", "charset=ISO-8859-1"}, {"a", "b"}}), "charset=UTF-8"},
-		{MakeCatalogue({{"a", "b"}}), "charset=UTF-8"},
-	};
-	for (const auto& [bytes, message] : damages)
-	{
-		EXPECT_FALSE(catalogue.Parse(bytes, error)) << message;
-		EXPECT_THAT(error, HasSubstr(message));
+		EXPECT_FALSE(catalogue.Parse(bytes, error)) << complaint;
+		EXPECT_THAT(error, HasSubstr(complaint));
 	}
-	EXPECT_EQ(catalogue.Find("$$$/a/Draft=Draft"), "Entwurf");
+	const std::string other = MakeCatalogue({kHeader, {"$$$/a/Draft\4Draft", "anders"}});
+	EXPECT_GT(zontest::FailEachAllocation([&] { catalogue.Parse(other, error); },
+				  [&] { EXPECT_EQ(catalogue.Find("$$$/a/Draft=Draft"), "Entwurf"); }),
+		0);
+	EXPECT_EQ(catalogue.Find("$$$/a/Draft=Draft"), "anders");
 
 	// Every single flipped bit either is refused or leaves a catalogue that can be searched.
 	for (std::size_t bit = 0; bit < 8 * sound.size(); ++bit)
 	{
 		std::string bytes = sound;
 		bytes[bit / 8] = static_cast<char>(bytes[bit / 8] ^ 1 << bit % 8);
-		MessageCatalogue other;
-		if (other.Parse(bytes, error))
-			other.Find("$$$/a/Draft=Draft");
+		if (catalogue.Parse(bytes, error))
+			catalogue.Find("$$$/a/Draft=Draft");
 	}
 }
 
-TEST(MessageCatalogue, SaysWhyAFileCannotBeRead)
+TEST(MessageCatalogue, IsReadFromFilesOfUpTo64MB)
 {
 	MessageCatalogue catalogue;
 	std::string error;
 	EXPECT_FALSE(catalogue.Load("no/such/catalogue.mo", error));
 	EXPECT_EQ(error, "no/such/catalogue.mo: cannot be opened: No such file or directory");
 	EXPECT_FALSE(catalogue.Load(".", error));
-	EXPECT_THAT(error, HasSubstr("cannot be read"));
+	EXPECT_THAT(error, testing::StartsWith(".: cannot be read: "));
+
+	const std::string path = testing::TempDir() + "MessageCatalogueTest-" + std::to_string(::getpid());
+	std::ofstream(path, std::ios::binary) << MakeCatalogue(kGerman);
+	for (const unsigned size : {64u << 20, (64u << 20) + 1})
+	{
+		std::filesystem::resize_file(path, size);   // what follows the texts is not looked at
+		EXPECT_EQ(catalogue.Load(path, error), size == 64u << 20) << error;
+	}
+	EXPECT_THAT(error, HasSubstr("at most 64 MB"));
+	EXPECT_EQ(catalogue.Find("$$$/a/Draft=Draft"), "Entwurf");
+	std::filesystem::remove(path);
+	EXPECT_TRUE(catalogue.Parse(MakeCatalogue({}), error));
 }
 
 TEST(MessageCatalogue, IsAskedAfterTheTranslatorAndBeforeTheEnglishText)
 {
-	auto catalogue = std::make_shared<MessageCatalogue>();
+	const auto catalogue = std::make_shared<MessageCatalogue>();
 	std::string error;
 	ASSERT_TRUE(catalogue->Parse(MakeCatalogue(kGerman), error)) << error;
-	Localizer& localizer = Localizer::Get();
-	const auto lookup = [&](std::string_view inKey) { return utility::UTF16to8(localizer.Lookup(inKey)); };
-
-	localizer.SetCatalogue(catalogue);
-	localizer.SetTranslator(
-		[](std::string_view inKey, UTF16String& outText)
-		{
-			outText = utility::AsciiToUTF16("host");
-			return inKey.starts_with("$$$/a/High");
-		});
-	EXPECT_EQ(lookup("$$$/a/High=High"), "host");
-	EXPECT_EQ(lookup("$$$/a/Draft=Draft"), "Entwurf");
-	EXPECT_EQ(lookup("$$$/a/Low=Low"), "Low");
-	localizer.SetTranslator({});
+	Localizer::Get().SetCatalogue(catalogue);
+	const auto lookup = [](std::string_view inKey) { return utility::UTF16to8(Localizer::Get().Lookup(inKey)); };
+	{
+		const zontest::WithTranslator translator(
+			[](std::string_view inKey, UTF16String& outText)
+			{
+				outText = utility::AsciiToUTF16("host");
+				return inKey.starts_with("$$$/a/High");
+			});
+		EXPECT_EQ(lookup("$$$/a/High=High"), "host");
+		EXPECT_EQ(lookup("$$$/a/Draft=Draft"), "Entwurf");
+		EXPECT_EQ(lookup("$$$/a/Low=Low"), "Low");
+	}
 	EXPECT_EQ(lookup("$$$/a/High=High"), "Hoch");
-	localizer.SetCatalogue({});
+	Localizer::Get().SetCatalogue({});
 	EXPECT_EQ(lookup("$$$/a/High=High"), "High");
 }
 
 }   // namespace
-}   // namespace zoncore::config

@@ -3,9 +3,12 @@
 /// \file
 /// Runs a program as a user does, from a shell, and keeps what it said.
 
+#include <algorithm>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 #include <iterator>
 #include <string>
 #include <string_view>
@@ -21,32 +24,17 @@ struct Outcome
 };
 
 /// A folder of this process alone, removed when it ends.
-class ScratchFolder
+struct ScratchFolder
 {
-public:
-	ScratchFolder() : mPath(std::filesystem::temp_directory_path() / ("zonmedia-test-" + std::to_string(getpid())))
-	{
-		std::filesystem::create_directories(mPath);
-	}
+	const std::string mPath = testing::TempDir() + "zonmedia-test-" + std::to_string(::getpid()) + "/";
+
+	ScratchFolder() { std::filesystem::create_directories(mPath); }
 	ScratchFolder(const ScratchFolder&) = delete;
 	ScratchFolder& operator=(const ScratchFolder&) = delete;
-	~ScratchFolder()
-	{
-		std::error_code ignored;
-		std::filesystem::remove_all(mPath, ignored);
-	}
-
-	std::string operator/(std::string_view inName) const { return (mPath / inName).string(); }
-
-private:
-	std::filesystem::path mPath;
+	~ScratchFolder() { std::filesystem::remove_all(mPath); }
 };
-
-inline const ScratchFolder& Scratch()
-{
-	static const ScratchFolder sFolder;
-	return sFolder;
-}
+inline const ScratchFolder sScratchFolder;
+inline const std::string& kScratch = sScratchFolder.mPath;
 
 inline std::string FileText(const std::string& inPath)
 {
@@ -62,18 +50,23 @@ inline std::string ShellQuoted(std::string_view inText)
 	return quoted + "'";
 }
 
-/// Runs inProgram with inInput as its standard input.
-inline Outcome RunProgram(
-	const std::string& inProgram, const std::vector<std::string>& inArguments, const std::string& inInput = "")
+/// Runs ZON_PROGRAM with inInput as its standard input.
+inline Outcome Zonmedia(const std::vector<std::string>& inArguments, const std::string& inInput = "")
 {
-	const std::string input = Scratch() / "input";
-	const std::string output = Scratch() / "output";
-	const std::string errors = Scratch() / "errors";
-	std::ofstream(input, std::ios::binary) << inInput;
-	std::string command = ShellQuoted(inProgram);
+	std::ofstream(kScratch + "input", std::ios::binary) << inInput;
+	std::string command = ShellQuoted(ZON_PROGRAM);
 	for (const std::string& argument : inArguments)
 		command += " " + ShellQuoted(argument);
-	command += " <" + ShellQuoted(input) + " >" + ShellQuoted(output) + " 2>" + ShellQuoted(errors);
-	const int status = std::system(command.c_str());
-	return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, FileText(output), FileText(errors)};
+	const int status
+		= std::system(("cd " + ShellQuoted(kScratch) + " && " + command + " <input >output 2>errors").c_str());
+	return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, FileText(kScratch + "output"), FileText(kScratch + "errors")};
+}
+
+/// One line on standard error that says which program complains and contains inComplaint.
+inline void ExpectComplaint(const Outcome& inOutcome, int inStatus, const std::string& inComplaint)
+{
+	EXPECT_EQ(inOutcome.mStatus, inStatus) << inComplaint;
+	EXPECT_THAT(inOutcome.mErrors, testing::StartsWith("zonmedia: "));
+	EXPECT_THAT(inOutcome.mErrors, testing::HasSubstr(inComplaint));
+	EXPECT_EQ(std::ranges::count(inOutcome.mErrors, '\n'), 1) << inOutcome.mErrors;
 }

@@ -39,6 +39,8 @@ TEST(RatioTime, RoundsToTheNearestTick)
 	EXPECT_EQ(RatioTimeToTime(RatioTime(kMost)).GetTicks(), kLeast);
 	EXPECT_EQ(RatioTimeToTime(RatioTime(kLeast)).GetTicks(), kLeast);
 	EXPECT_EQ(RatioTimeToTime({1, kMost}).GetTicks(), 0);
+	const TickTime sample(72'081'624'662'019'000);   // at 192 kHz, of more ticks than a double holds
+	EXPECT_EQ(RatioTimeToTime(TimeToRatioTime(sample)) - sample, TickTime(8));
 }
 
 // Frames and samples of a day, there and back; through 32-bit terms as long as the fraction fits into them.
