@@ -156,6 +156,7 @@ TEST(Zonmedia, ComplainsInOneLine)
 	};
 	for (const auto& [arguments, status, complaint] : std::initializer_list<Case>{
 			 {{}, 2, "subcommand is required"},
+			 {{"time", "1", "--display", "tc"}, 2, "no display is named \"tc\"; there are 24, 25, "},
 			 {{"tiem"}, 2, "no command is named \"tiem\"; the closest are time"},
 			 {{"time"}, 2, "VALUE is required"},
 			 {{"time", "1", "--display", "frames"}, 2, "--rate is required"},

@@ -50,7 +50,7 @@ std::string Explanation(const CLI::App& inApplication, const CLI::ParseError& in
 		commands.emplace_back(command->get_name());
 	if (extras.empty() || extras.front().starts_with('-') || commands.empty())
 		return std::string(inError.what()) + " (see --help)";
-	return UnknownName("command", extras.front(), commands);
+	return UnknownName("command", extras.front(), commands) + " (see --help)";
 }
 
 // Fine, or a complaint: the command runs all the same, in English.

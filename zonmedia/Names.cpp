@@ -10,6 +10,7 @@ namespace
 {
 
 constexpr std::size_t kSuggestions = 4;
+constexpr std::size_t kMostOfShortList = 20;   // a list that is shown whole when nothing in it is close
 
 constexpr bool IsIgnored(char inChar)
 {
@@ -91,8 +92,11 @@ std::string UnknownName(std::string_view inWhat, std::string_view inText, std::v
 		byDistance.emplace_back(Distance{!isWithin, EditDistance(name, inText)}, name);
 	}
 	std::ranges::stable_sort(byDistance, {}, &std::pair<Distance, std::string_view>::first);
-	std::string sentence = "no " + std::string(inWhat) + " is named " + Quoted(inText) + "; the closest are";
-	for (std::size_t i = 0; i < std::min(kSuggestions, byDistance.size()); ++i)
+	const bool isAnyClose = byDistance.empty() || byDistance.front().first < Distance{true, Folded(inText).size()};
+	const bool showsAll = !isAnyClose && byDistance.size() <= kMostOfShortList;
+	std::string sentence = "no " + std::string(inWhat) + " is named " + Quoted(inText);
+	sentence.append(showsAll ? "; there are" : "; the closest are");
+	for (std::size_t i = 0; i < (showsAll ? byDistance.size() : std::min(kSuggestions, byDistance.size())); ++i)
 		sentence.append(i == 0 ? " " : ", ").append(byDistance[i].second);
 	return sentence;
 }

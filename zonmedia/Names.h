@@ -31,7 +31,8 @@ std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS);
 /// Whether two names are one: but for case, "_", "-" and blanks. Compares without writing either anew.
 bool IsSameName(std::string_view inLHS, std::string_view inRHS);
 
-/// A sentence that refuses inText: what it is no name of, and the closest of inNames, those first that hold it.
+/// A sentence that refuses inText: what it is no name of, and the closest of inNames, those first that hold it; all of a
+/// short list in which nothing is close.
 std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames);
 
 /// The value that inText names: exactly, or else but for case and "_". Throws UsageProblem with the closest names.
