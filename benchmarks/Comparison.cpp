@@ -57,7 +57,7 @@ void Register(const std::string& inName, Work inWork)
 		inName.c_str(), [work = std::move(inWork)](benchmark::State& ioState) { work(ioState); });
 }
 
-// Three significant digits.
+// Two decimals below 10, one below 100, none above.
 std::string Rounded(double inValue)
 {
 	std::ostringstream stream;

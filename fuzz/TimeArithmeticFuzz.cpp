@@ -1,6 +1,7 @@
 // Arithmetic on times, rates, ratios and time bases with any integers; divisions by 0 are left out, they are faults.
 
 #include "BufferChecks.h"
+#include "RateInput.h"
 #include "zoncore/Reciprocal.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
@@ -22,13 +23,9 @@ using namespace zonmediatypes;
 using zonfuzz::FuzzInput;
 using zonfuzz::Require;
 using zonfuzz::RequireInBuffers;
+using zonfuzz::TakeRate;
 
 using Exact = boost::multiprecision::cpp_int;
-
-FrameRate TakeRate(FuzzInput& ioInput)
-{
-	return ioInput.Flag() ? FrameRate(ioInput.Edge<std::int64_t>()) : ioInput.OneOf(AllFrameRates());
-}
 
 // The low 64 bits of an exact result, as arithmetic that wraps gives them.
 std::int64_t Wrapped(Exact inValue)
@@ -203,7 +200,10 @@ void CheckTimeBase(FuzzInput& ioInput)
 	const auto numerator = ioInput.Edge<std::int64_t>();
 	const auto denominator = ioInput.Edge<std::int64_t>();
 	const auto base = TimeBase::FromRatio(numerator, denominator);
-	Require(!base || (numerator > 0 && denominator > 0), "time runs forward");
+	const Exact ticks = Exact(kTicksPerSecond) * numerator;
+	const bool isPositive = numerator > 0 && denominator > 0;
+	Require(base.has_value() == (isPositive && ticks / gcd(ticks, Exact(denominator)) <= INT64_MAX),
+		"empty only for what does not fit");
 	if (!base)
 		return;
 	const auto rounding = static_cast<Rounding>(ioInput.Below(4));
@@ -224,7 +224,6 @@ void CheckTimeBase(FuzzInput& ioInput)
 														 : distance >= 0),
 				"on the side asked for");
 	};
-	const Exact ticks = Exact(kTicksPerSecond) * numerator;
 	expect(base->FromTicks(TickTime(value), rounding), denominator, ticks);
 	if (const auto ratio = base->ToRatio())
 		Require(Exact(ratio->mNumerator) * denominator == Exact(numerator) * ratio->mDenominator

@@ -2,6 +2,7 @@
 
 #include "BufferChecks.h"
 #include "Numbers.h"
+#include "RateInput.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <algorithm>
@@ -21,17 +22,13 @@ using zonfuzz::Numbers;
 using zonfuzz::ReadNumbers;
 using zonfuzz::Require;
 using zonfuzz::RequireInBuffers;
+using zonfuzz::TakeRate;
 
 constexpr std::int64_t kDay = 86'400 * kTicksPerSecond;
 
 bool IsFeet(TimeDisplay inDisplay)
 {
 	return inDisplay == kTimeDisplay_16mmFeetFrames || inDisplay == kTimeDisplay_35mmFeetFrames;
-}
-
-FrameRate TakeRate(FuzzInput& ioInput)
-{
-	return ioInput.Flag() ? FrameRate(ioInput.Edge<std::int64_t>()) : ioInput.OneOf(AllFrameRates());
 }
 
 TimeDisplay TakeDisplay(FuzzInput& ioInput)

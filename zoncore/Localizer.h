@@ -69,12 +69,12 @@ namespace zoncore
 {
 
 /// Fills "@0" ... "@9" of inTemplate with inReplacements, in one pass: text that was filled in is not searched again. A
-/// placeholder without replacement stays as it is, and so does "@" without a digit; "@10" is "@1" and a zero. Costs one
-/// allocation for a short text, and is linear in the text that comes out.
+/// placeholder without replacement stays as it is, and so does "@" without a digit; "@10" is "@1" and a zero. Costs at most
+/// one allocation, and time linear in the template and the text that comes out.
 ZONCORE_API UTF16String FillPlaceholders(UTF16StringView inTemplate, std::span<const UTF16String> inReplacements);
 
 /// The same into a caller's buffer, without a terminator. Returns the length of the text; a buffer that is too short for it
-/// is left alone.
+/// is left alone. The buffer overlaps neither the template nor a replacement.
 ZONCORE_API std::size_t FillPlaceholders(
 	std::span<UTF16Char> outText, UTF16StringView inTemplate, std::span<const UTF16String> inReplacements) noexcept;
 

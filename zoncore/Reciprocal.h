@@ -3,12 +3,14 @@
 /// \file
 /// Exact division by a number that is known at run time only and serves many times.
 ///
-///     const Reciprocal perFrame(inRate.GetTicksPerFrame());
-///     for (const std::uint64_t ticks : column)
-///         frames.push_back(perFrame.Divide(ticks));       // ticks / perFrame
+///     const Reciprocal perRow(inWidth);
+///     for (const std::uint64_t offset : offsets)
+///         rows.push_back(perRow.Divide(offset));       // offset / inWidth
 ///
 /// Compilers replace a division by a constant by a multiplication; this does the same for a divisor of the program's own,
 /// after T. Granlund and P. Montgomery, "Division by invariant integers using multiplication" (1994).
+
+#include "zoncore/WrappingArithmetic.h"
 
 #include <bit>
 #include <cstdint>
@@ -22,13 +24,13 @@ public:
 	/// What Divide takes; the magnitude of every signed number is within.
 	static constexpr std::uint64_t kMostDividend = std::uint64_t{1} << 63;
 
-	/// inDivisor is from 1 to 2^63. Costs one division of 128 bits.
+	/// inDivisor is from 1 to 2^63; 0 is a divide fault, in a constant expression an error. Costs one division of 128 bits.
 	explicit constexpr Reciprocal(std::uint64_t inDivisor) noexcept
 		: mFactor(RoundedUpFactor(inDivisor)), mShift(LogarithmRoundedUp(inDivisor) - 1)
 	{
 	}
 
-	/// inDividend divided by the divisor, truncated; inDividend is at most kMostDividend.
+	/// inDividend divided by the divisor, truncated. A dividend above kMostDividend gives a meaningless number.
 	constexpr std::uint64_t Divide(std::uint64_t inDividend) const noexcept
 	{
 		if (mFactor == 0)
@@ -51,6 +53,8 @@ private:
 	// divisor of 1 has the factor 0 and divides nothing.
 	static constexpr std::uint64_t RoundedUpFactor(std::uint64_t inDivisor) noexcept
 	{
+		if (inDivisor == 0)
+			RaiseDivideFault();
 		if (inDivisor == 1)
 			return 0;
 		const UInt128 power = UInt128{1} << (63 + LogarithmRoundedUp(inDivisor));

@@ -49,8 +49,8 @@ public:
 	constexpr FrameRate operator*(int inValue) const noexcept { return FrameRate(*this) *= inValue; }
 	constexpr FrameRate operator*(double inValue) const noexcept { return FrameRate(*this) *= inValue; }
 
-	/// The rate becomes inValue times slower: the duration is multiplied by inValue, wrapping for an integer, truncated
-	/// toward zero for a double. kFrameRate_Film24 / 1.001 is one tick short of kFrameRate_23976, because the product of
+	/// The rate becomes inValue times slower: the duration is multiplied by inValue, wrapping for an integer; for a double
+	/// truncated toward zero, and the most negative duration for a product that is NaN or out of range. kFrameRate_Film24 / 1.001 is one tick short of kFrameRate_23976, because the product of
 	/// doubles is just below a whole number: use the constants where a rate must be exact.
 	constexpr FrameRate& operator/=(int inValue) noexcept;
 	constexpr FrameRate& operator/=(double inValue) noexcept;

@@ -21,7 +21,7 @@
 /// of it.
 ///
 /// Misuse (no BeatInfo for a musical format, no beats per bar, drop-frame together with NTSC) is reported to the assert
-/// dialog of zoncore/Debug.h; the result is then false and the output is as before the call.
+/// dialog of zoncore/Debug.h; the result is then false, of the forms for buffers 0, and the output is as before the call.
 
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/Export.h"
@@ -129,12 +129,12 @@ inline std::int64_t ConvertBarsAndBeatsToSamples(
 /// untouched, when a BeatInfo is needed and missing, or has no beats per bar.
 ///
 /// Milliseconds have one decimal and deliberately no more than six significant digits: 123,456.7 ms is "123457", and
-/// 1,234,567 ms "1.23457e+06".
+/// 1,234,567 ms "1.23457e+06". At a sample rate of 0 they are "0".
 ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, std::int64_t inSamples,
 	std::int32_t inSampleRate, TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo,
 	bool inIsDuration);
 
-/// The longest text of any position in any format.
+/// No text of any position is longer, in any format.
 inline constexpr std::size_t kLongestPosition = 84;
 
 /// The same text, ASCII in any case, into a caller's buffer, without a terminator. Returns its length; a buffer that is too
@@ -179,7 +179,8 @@ ZONMEDIATYPES_API void ConvertSamplesToDecimalTimecode(
 /// bars count down through 0 while beats stay 1 to iBeatsPerBar.
 ///
 /// With iTicksPerBeat -1 the text is, for every style, the bar and right behind it the beat with decimals whose digits
-/// are all "0": deliberate, and no reader takes it. False, and outText untouched, when iBeatsPerBar is 0.
+/// are all "0" (from style 3 on ".000" follows): deliberate, and no reader takes it. At a sample rate, tempo, beat value
+/// or iTicksPerBeat of 0 the text means nothing. False, and outText untouched, when iBeatsPerBar is 0.
 ZONMEDIATYPES_API bool ConvertSamplesToBarsAndBeats(zoncore::UTF16String& outText, double inSamples,
 	double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration, std::int32_t inStyle);
 

@@ -48,15 +48,17 @@ using TimecodeFlags = zoncore::Flags<unsigned int>;
 /// Splits the magnitude of a time into fields; outNegative is its sign. Hours wrap at 24, so times of a day and more lose
 /// whole days. Frames are truncated toward zero.
 ///
-/// At kTimeDisplay_Frames outFrames is the signed frame count and the other fields are 0. At a display whose rate is not
-/// usable, negative or slower than one frame a second, all fields are 0. outNegative is the sign of the time for these and
-/// for drop-frame numbering, the sign of the frame number for all others.
+/// At kTimeDisplay_Frames outFrames is the signed frame count at any usable rate, and the other fields are 0. At every other
+/// display whose rate is not usable, negative or slower than one frame a second, all fields are 0. outNegative is the sign
+/// of the time at kTimeDisplay_Frames, for drop-frame numbering and where there is no such rate; everywhere else it is the
+/// sign of the frame number, so that a time within the frame before zero is not negative.
 ZONMEDIATYPES_API void TimeToHMSF(unsigned int& outHours, unsigned int& outMinutes, unsigned int& outSeconds,
 	unsigned long long& outFrames, bool& outNegative, TickTime inTime, FrameRate inRate,
 	TimeDisplay inDisplay) noexcept;
 
 /// The time of some fields. More frames than the caller's rate has in a second carry into seconds, seconds into minutes,
-/// minutes into hours; hours wrap at 24. No field is rejected, and what is too large wraps.
+/// minutes into hours; hours wrap at 24. No field is rejected, and what is too large wraps. At frames, feet and samples
+/// hours, minutes and seconds become frames of the caller's rate, truncated.
 ///
 /// Labels that drop-frame numbering skips have times, too: at 29.97 fps label 00 of a short minute is its first frame and
 /// label 01 the frame before (59.94: 01 to 03 the frames before). Deliberate: typed times are never refused.
@@ -76,8 +78,8 @@ ZONMEDIATYPES_API TickTime HMSFToTime(unsigned int inHours, unsigned int inMinut
 /// | timecode          | "01:02:03:04", drop-frame "01:02:03;04"                                   |
 /// | milliseconds      | "01:02:03.456"                                                            |
 /// | samples           | "01:02:03:00456", zeros in front as below                                 |
-/// | frames            | "-1000", always signed                                                    |
-/// | feet and frames   | "62+08"; a negative time is always signed                                 |
+/// | frames            | "1000"; a negative count has its "-" with any flags                        |
+/// | feet and frames   | "62+08"; a negative time has its "-" with any flags                        |
 /// | kTimeDisplay_Auto | as the display that fits the rate, else 29.97 fps drop-frame              |
 ///
 /// Samples are padded to 5 digits at rates of 11,000 to 109,999 Hz, to 4, 3 and 2 at each tenth of that, and not at all at
@@ -90,7 +92,7 @@ ZONMEDIATYPES_API TickTime HMSFToTime(unsigned int inHours, unsigned int inMinut
 ZONMEDIATYPES_API zoncore::UTF16String TimeToTimecode(
 	TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags = {});
 
-/// The longest text of any time at any rate and display, with any flags.
+/// No text of any time is longer, at any rate and display, with any flags.
 inline constexpr std::size_t kLongestTimecode = 30;
 
 /// The same text, ASCII in any case, into a caller's buffer, without a terminator. Returns its length; a buffer that is too
@@ -147,8 +149,9 @@ ZONMEDIATYPES_API zoncore::UTF16String RatioTimeToTimecode(
 // ---- Columns ---------------------------------------------------------------------------------------------------------
 //
 // A list of times that share rate, display and flags: the rows of an edit list, the labels of a ruler. Each row is what the
-// function for one time gives. The shorter span counts; the number of rows that were filled is returned. What depends on
-// rate and display is done once, divisions by the caller's rate become multiplications, and nothing is allocated.
+// function for one time gives. The shorter span counts; the number of rows that were filled is returned. Where times become
+// fields or text, what depends on rate and display is done once and divisions by the caller's rate become multiplications.
+// Nothing is allocated.
 
 /// What TimeToHMSF gives of one time.
 struct TimecodeFields
@@ -159,7 +162,7 @@ struct TimecodeFields
 	bool mNegative;
 	unsigned long long mFrames;
 
-	friend bool operator==(const TimecodeFields&, const TimecodeFields&) noexcept = default;
+	friend constexpr bool operator==(const TimecodeFields&, const TimecodeFields&) noexcept = default;
 };
 
 /// TimeToHMSF of each time.

@@ -49,7 +49,7 @@ struct LeadByte
 // clang-format off
 constexpr LeadByte ReadLeadByte(unsigned char inByte)
 {
-	if (inByte < 0xC2)   return {0, 0, 0, 0};
+	if (inByte < 0xC2)   return {};
 	if (inByte < 0xE0)   return {1, 0x80, 0xBF, 0x1F};
 	if (inByte == 0xE0)  return {2, 0xA0, 0xBF, 0x0F};
 	if (inByte == 0xED)  return {2, 0x80, 0x9F, 0x0F};
@@ -57,16 +57,15 @@ constexpr LeadByte ReadLeadByte(unsigned char inByte)
 	if (inByte == 0xF0)  return {3, 0x90, 0xBF, 0x07};
 	if (inByte < 0xF4)   return {3, 0x80, 0xBF, 0x07};
 	if (inByte == 0xF4)  return {3, 0x80, 0x8F, 0x07};
-	return {0, 0, 0, 0};
+	return {};
 }
 // clang-format on
 
-// The first code point of inText, which is not empty; U+FFFD for a maximal subpart that is ill-formed.
+// The first code point of inText, which begins with a byte that is not ASCII; U+FFFD for a maximal subpart that is
+// ill-formed.
 Decoded DecodeUTF8(std::string_view inText)
 {
 	const auto first = static_cast<unsigned char>(inText.front());
-	if (IsAscii(first))
-		return {first, 1};
 	const LeadByte lead = ReadLeadByte(first);
 	if (lead.mContinuations == 0)
 		return {kReplacementCharacter, 1};

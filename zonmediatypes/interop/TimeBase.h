@@ -35,27 +35,31 @@ enum class Rounding
 class TimeBase
 {
 public:
-	/// Units of inNumerator / inDenominator seconds each; empty unless both are positive and the reduced number of ticks to
-	/// a unit, or of units to a tick, fits 64 bits.
+	/// Units of inNumerator / inDenominator seconds each; empty unless both are positive and the ticks of a unit, as a
+	/// fraction in lowest terms, have a numerator that fits 64 bits.
 	static constexpr std::optional<TimeBase> FromRatio(std::int64_t inNumerator, std::int64_t inDenominator) noexcept;
 
 	/// The units that one frame or sample lasts; empty for a rate that is not usable or negative.
 	static constexpr std::optional<TimeBase> FromRate(FrameRate inRate) noexcept;
 
-	/// Empty when the result does not fit 64 bits.
+	/// inTime in units; empty when that does not fit 64 bits.
 	constexpr std::optional<std::int64_t> FromTicks(TickTime inTime, Rounding inRounding) const noexcept;
+
+	/// inUnits units as a time; empty when that does not fit 64 bits. Rounds nothing when IsExact().
 	constexpr std::optional<TickTime> ToTicks(std::int64_t inUnits, Rounding inRounding) const noexcept;
 
-	/// The seconds that a unit lasts, in lowest terms; empty when the denominator does not fit 64 bits.
+	/// A number of seconds in lowest terms.
 	struct Ratio
 	{
 		std::int64_t mNumerator, mDenominator;
 
 		friend constexpr bool operator==(const Ratio&, const Ratio&) noexcept = default;
 	};
+
+	/// The seconds that a unit lasts; empty when the denominator does not fit 64 bits.
 	constexpr std::optional<Ratio> ToRatio() const noexcept;
 
-	/// Whether every unit is a whole number of ticks: ToTicks then rounds nothing.
+	/// Whether every unit is a whole number of ticks.
 	constexpr bool IsExact() const noexcept { return mUnits.mNumber == 1; }
 
 	friend constexpr bool operator==(const TimeBase&, const TimeBase&) noexcept = default;

@@ -42,7 +42,8 @@ constexpr auto sFrameRates = std::to_array<FrameRate>({
 	kFrameRate_Zero,
 });
 
-double FramesPerSecondOf(FrameRate inRate)
+// A duration of 0 is written as the rate "inf".
+double WrittenFramesPerSecond(FrameRate inRate)
 {
 	if (inRate == kFrameRate_Zero)
 		return 0.0;
@@ -56,7 +57,7 @@ UTF16String RateText(FrameRate inRate)
 {
 	constexpr unsigned long kMinIntegerDigits = 1;
 	constexpr int kMaxLength = 31;
-	return zoncore::utility::NumberToString(FramesPerSecondOf(inRate), kMinIntegerDigits,
+	return zoncore::utility::NumberToString(WrittenFramesPerSecond(inRate), kMinIntegerDigits,
 		inRate == kFrameRate_23976 ? 3 : 2, zoncore::utility::kNumberFlag_DropTrailingZeros, kMaxLength);
 }
 

@@ -15,6 +15,8 @@ namespace zonmediatypes::utility
 {
 
 using PositionText = TextWriter<kLongestPosition>;
+static_assert(
+	kLongestPosition >= 4 * kLongestInteger + 3);   // bar, beat, ticks and thousandths, with what separates them
 
 /// Digits of the largest number below inCount, as far as positions are padded: 1 to 4.
 constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept

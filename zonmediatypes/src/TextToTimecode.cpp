@@ -1,5 +1,6 @@
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Timecode.h"
+#include "zonmediatypes/src/Digits.h"
 #include "zonmediatypes/src/TimecodeFields.h"
 
 #include <algorithm>
@@ -16,11 +17,7 @@ using zoncore::UTF16Char;
 using zoncore::UTF16StringView;
 using zoncore::utility::WrappingAdd;
 using zoncore::utility::WrappingMultiply;
-
-constexpr bool IsDigit(UTF16Char inChar)
-{
-	return inChar >= '0' && inChar <= '9';
-}
+using zoncore::utility::WrappingNegate;
 
 constexpr bool IsWhiteSpace(UTF16Char inChar)
 {
@@ -53,7 +50,6 @@ struct TextFields
 // Four groups of two digits, read without a branch for every character. False for all other text.
 bool ReadUsualFields(UTF16StringView inText, TextFields& outFields)
 {
-	constexpr std::size_t kUsualLength = 11;
 	if (inText.size() != kUsualLength || !IsSeparator(inText[2]) || !IsSeparator(inText[5]) || !IsSeparator(inText[8]))
 		return false;
 	bool isNumber = true;
@@ -158,8 +154,8 @@ TickTime ReadFeet(UTF16StringView inText, FrameRate inRate, int inFramesPerFoot,
 	const std::size_t feetEnd = separators == 1 ? found : text.size() - std::min<std::size_t>(text.size(), 2);
 	const std::int64_t feet = ReadFilmNumber(text.substr(0, feetEnd));
 	const std::int64_t frames = ReadFilmNumber(text.substr(feetEnd + static_cast<std::size_t>(separators)));
-	const TickTime count(WrappingAdd(WrappingMultiply(feet, inFramesPerFoot), frames));
-	const auto signedCount = static_cast<std::int32_t>((inText.front() == '-' ? -count : count).GetTicks());
+	const std::int64_t count = WrappingAdd(WrappingMultiply(feet, inFramesPerFoot), frames);
+	const auto signedCount = static_cast<std::int32_t>(inText.front() == '-' ? WrappingNegate(count) : count);
 	const TickTime time = MovedByFrames(kTime_Zero, signedCount, inRate);
 	if (!inFlags.Test(kTimecodeFlag_LastFrame))
 		return time;

@@ -2,6 +2,7 @@
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
+#include "zonmediatypes/src/Digits.h"
 #include "zonmediatypes/src/DropFrame.h"
 #include "zonmediatypes/src/SampleClock.h"
 
@@ -101,7 +102,7 @@ bool ReportMissingBeatInfo(std::atomic<bool>& ioDisabled, const char* inFunction
 // ---- Text to samples -------------------------------------------------------------------------------------------------
 
 // The numbers that text carries; mSubframes / mSubframeDivisor is a fraction of one frame.
-struct TimecodeFields
+struct TypedFields
 {
 	std::int32_t mHours;
 	std::int32_t mMinutes;
@@ -110,11 +111,6 @@ struct TimecodeFields
 	std::int32_t mSubframes;
 	std::int32_t mSubframeDivisor;
 };
-
-constexpr bool IsDigit(UTF16Char inChar)
-{
-	return static_cast<unsigned>(inChar) - '0' < 10;
-}
 
 // Takes the digits off the front of ioText; 0 for a number that does not fit.
 std::int32_t TakeField(UTF16StringView& ioText)
@@ -146,7 +142,7 @@ constexpr std::int32_t PowerOfTen(std::size_t inExponent)
 	return inExponent < kPowers.size() ? kPowers[inExponent] : std::numeric_limits<std::int32_t>::min();
 }
 
-TimecodeFields ParseTimeCodeString(UTF16StringView inText)
+TypedFields ParseTimeCodeString(UTF16StringView inText)
 {
 	constexpr std::size_t kLabels = 4;
 	constexpr std::size_t kMostFields = 5;
@@ -177,7 +173,7 @@ std::int32_t CountFrames(
 	return WrappingAdd(WrappingMultiply(seconds, inFrameRate), inFrames);
 }
 
-std::int32_t CountFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
+std::int32_t CountFrames(const TypedFields& inFields, std::int32_t inFrameRate)
 {
 	const std::int32_t minutes = WrappingAdd(WrappingMultiply(inFields.mHours, 60), inFields.mMinutes);
 	return CountFrames(minutes, inFields.mSeconds, inFields.mFrames, inFrameRate);
@@ -185,7 +181,7 @@ std::int32_t CountFrames(const TimecodeFields& inFields, std::int32_t inFrameRat
 
 // The frame that drop-frame labels stand for; labels that are dropped stand for the first one that is not. The
 // quotients are exact at 30 and 60 only and serve every rate as they are. 32-bit, wrapping.
-std::int32_t CountDropFrames(const TimecodeFields& inFields, std::int32_t inFrameRate)
+std::int32_t CountDropFrames(const TypedFields& inFields, std::int32_t inFrameRate)
 {
 	const std::int32_t droppedPerMinute = inFrameRate / 15;
 	const std::int32_t droppedPerHour = WrappingMultiply(inFrameRate, 108) / 30;
@@ -204,7 +200,7 @@ std::int32_t CountDropFrames(const TimecodeFields& inFields, std::int32_t inFram
 
 // The first sample at or behind a frame and a fraction of it. Wraps, but beyond the range of the integer formula the
 // result is that of doubles.
-std::int64_t FramesToSamples(std::int32_t inFrames, const TimecodeFields& inFields, std::int32_t inSampleRate,
+std::int64_t FramesToSamples(std::int32_t inFrames, const TypedFields& inFields, std::int32_t inSampleRate,
 	std::int32_t inFrameRate, bool inNTSC)
 {
 	constexpr double kLargestExact = 0x7p60;
@@ -230,7 +226,7 @@ std::int64_t FramesToSamples(std::int32_t inFrames, const TimecodeFields& inFiel
 // Decimal text in units of its smallest field: timecode fields one place to the left, hours lost.
 double ReadDecimal(UTF16StringView inText)
 {
-	const TimecodeFields fields = ParseTimeCodeString(inText);
+	const TypedFields fields = ParseTimeCodeString(inText);
 	const double units = fields.mFrames + static_cast<double>(fields.mSubframes) / fields.mSubframeDivisor;
 	return fields.mMinutes * 3'600.0 + (fields.mSeconds * 60.0 + (0.0 + units));
 }
@@ -271,7 +267,7 @@ bool CanDivideBy(std::int32_t inSampleRate, std::int32_t inFrameRate, const Time
 }
 
 // The frame count at 1000/1001 of a nominal rate, from the left to the right in doubles: one short on some frames.
-std::int32_t CountDropFrames(std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate)
+std::int32_t EstimateDropFrameCount(std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate)
 {
 	const double multiple = inFrameRate / 30.0;
 	const double perTenMinutes = inFrameRate * 600.0 / 1.001;
@@ -336,7 +332,7 @@ void PutTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSa
 	if (!CanDivideBy(inSampleRate, inFrameRate, inStyle))
 		return ioText.Put('0');
 	if (inStyle.mDropFrame && inStyle.mFrameCountOnly)
-		return ioText.PutNumber(CountDropFrames(inSamples, inSampleRate, inFrameRate));
+		return ioText.PutNumber(EstimateDropFrameCount(inSamples, inSampleRate, inFrameRate));
 	const FramePosition position = SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle);
 	if (inStyle.mFrameCountOnly)
 		return ioText.PutNumber(static_cast<std::int32_t>(position.GetFrames()));
@@ -444,7 +440,7 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inTimeco
 		outSamples = kNoPosition;
 		return true;
 	}
-	const TimecodeFields fields = ParseTimeCodeString(inTimecode);
+	const TypedFields fields = ParseTimeCodeString(inTimecode);
 	const std::int32_t frames = inDropFrame ? CountDropFrames(fields, inFrameRate) : CountFrames(fields, inFrameRate);
 	outSamples = FramesToSamples(frames, fields, inSampleRate, inFrameRate, inNTSC);
 	return true;

@@ -46,7 +46,8 @@ struct TimeDisplayRow
 };
 
 /// A display that counts at a rate of its own. A second that is not a whole number of frames long is numbered as if the
-/// frame that it ends in were whole; drop-frame numbering makes up for that with two labels of every thirty.
+/// frame that it ends in were whole; drop-frame numbering makes up for that with two labels a short
+/// minute for every thirty in a second.
 consteval TimeDisplayRow FixedRateDisplay(TimeDisplay inDisplay, FrameRate inRate,
 	FrameNumbering inNumbering = FrameNumbering::Straight, DisplayKind inKind = DisplayKind::Timecode)
 {

@@ -10,6 +10,7 @@
 #include "zonmediatypes/src/TimeDisplayTable.h"
 
 #include <cmath>
+#include <cstddef>
 #include <cstdint>
 #include <limits>
 
@@ -17,6 +18,9 @@
 
 namespace zonmediatypes
 {
+
+/// The characters of "HH:MM:SS:FF". Nearly all text has this form: it is written where it stays, and read without a loop.
+inline constexpr std::size_t kUsualLength = 11;
 
 // kTimeDisplay_Auto is for media: pulled-down rates are numbered with drop frames.
 inline TimeDisplay ChooseDisplay(TimeDisplay inDisplay, FrameRate inRate) noexcept
@@ -187,8 +191,8 @@ inline bool ExceedsSecond(std::uint64_t inFrames, FrameRate inRate) noexcept
 	return static_cast<std::int64_t>(inFrames) * duration > kTicksPerSecond;
 }
 
-/// Takes whole seconds out of the frames. The count of frames in a second is that of the next slower rate whose second is a
-/// whole number of frames, formed through double as hosts form it.
+/// Takes whole seconds out of the frames. The count of frames in a second is that of the rate itself or of the next faster
+/// one with a whole number of frames in a second, formed through double as hosts form it.
 inline HMSF CarryFrames(HMSF inFields, FrameRate inRate) noexcept
 {
 	using zoncore::utility::TruncateTo;

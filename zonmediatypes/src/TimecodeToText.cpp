@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <string_view>
 
 namespace zonmediatypes
 {
@@ -16,6 +17,7 @@ using zoncore::UTF16String;
 using zoncore::utility::Magnitude;
 
 using TimecodeWriter = TextWriter<kLongestTimecode>;
+static_assert(kLongestTimecode >= std::string_view("-23:59:59:").size() + kLongestInteger);
 
 constexpr char FrameSeparator(const TimeDisplayRow& inRow)
 {
@@ -36,10 +38,6 @@ std::size_t FrameDigits(const TimeDisplayRow& inRow, FrameRate inRate)
 		return 1;
 	return nominal <= 109 ? 2 : nominal <= 1'099 ? 3 : nominal <= 10'999 ? 4 : 5;
 }
-
-// Four fields of two digits: nearly all text has this form. Its length is known before it is written, so that it is written
-// where it stays.
-constexpr std::size_t kUsualLength = 11;
 
 // What the texts of one rate, display and set of flags have in common.
 class TextForm
