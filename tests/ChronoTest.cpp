@@ -27,6 +27,7 @@ static_assert(!ToTickTime(std::chrono::hours(20'000)) && !ToTickTime(std::chrono
 static_assert(ToDuration(kTime_Max) == 100h);
 static_assert(ToDuration<std::chrono::milliseconds>(TickTime(-1), Rounding::Up) == 0ms);
 static_assert(ToDuration<std::chrono::milliseconds>(TickTime(-1), Rounding::Down) == -1ms);
+static_assert(ToDuration<TickDuration>(TickTime(kMin), Rounding::Down) == TickDuration::min());   // nothing is negated
 static_assert(!ToDuration<std::chrono::duration<std::int8_t>>(kTime_Max, Rounding::Nearest));
 
 // The definition of each rounding, in numbers that cannot overflow; empty when the result does not fit.
@@ -45,7 +46,7 @@ std::optional<std::int64_t> RoundedQuotient(const Wide& inDividend, const Wide& 
 TEST(TimeBase, RoundsExactlyOverTheWholeRange)
 {
 	std::mt19937_64 random(1);
-	const std::int64_t edges[] = {0, 1, -1, kMin, kMax, kMin + 1};
+	const std::int64_t edges[] = {0, 1, -1, kMin, kMax, kMin + 1, kMin / 2, -(kMin / 2)};
 	const std::pair<std::int64_t, std::int64_t> ratios[] = {{1, 90'000}, {1'001, 30'000}, {1, 48'000}, {7, 3},
 		{1, kTicksPerSecond}, {1, 2 * kTicksPerSecond}, {1, kMax}, {36'000'000, 1}, {9'999'937, 1'000'003}};
 	for (const auto& [numerator, denominator] : ratios)
@@ -55,7 +56,7 @@ TEST(TimeBase, RoundsExactlyOverTheWholeRange)
 		for (int i = 0; i < 8'000; ++i)
 		{
 			const auto rounding = static_cast<Rounding>(i % 4);
-			const auto value = i < 24 ? edges[i / 4] : static_cast<std::int64_t>(random()) >> random() % 64;
+			const auto value = i < 32 ? edges[i / 4] : static_cast<std::int64_t>(random()) >> random() % 64;
 			const Wide ticks = Wide(value) * kTicksPerSecond * numerator;
 			const auto time = base->ToTicks(value, rounding);
 			EXPECT_EQ(
@@ -86,6 +87,7 @@ TEST(Chrono, TakesAndGivesFloatingPointDurations)
 	EXPECT_EQ(ToDuration<Seconds>(kTime_Max).count(), 360'000.0);
 	EXPECT_EQ(ToTickTime(Seconds(0.5)), TickTime(kTicksPerSecond / 2));
 	EXPECT_EQ(ToTickTime(Seconds(-1.0 / 508'032'000'000)), TickTime(-1));
+	EXPECT_EQ(ToTickTime(std::chrono::duration<double, TickDuration::period>(-0x1p63)), TickTime(kMin));
 	for (const double none : {std::nan(""), HUGE_VAL, -HUGE_VAL, 4e7})
 		EXPECT_FALSE(ToTickTime(Seconds(none)));
 }

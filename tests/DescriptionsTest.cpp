@@ -81,11 +81,27 @@ TEST(Descriptions, OfEnumerations)
 			"2 Lower Field First", "3 Fields (Unknown Dominance)", "4 Any Field Order"}));
 }
 
+// A caller's buffer gets the same text when it is long enough, and stays as it is when it is not.
+template <class Char>
+void ExpectRateInBuffer(FrameRate inRate)
+{
+	const std::string text = UTF16to8(FrameRateDescription(inRate));
+	std::vector<Char> buffer(text.size());
+	EXPECT_EQ(FrameRateDescription(std::span(buffer).first(text.size() - 1), inRate), text.size());
+	EXPECT_EQ(buffer, std::vector<Char>(text.size()));
+	EXPECT_EQ(FrameRateDescription(std::span(buffer), inRate), text.size());
+	EXPECT_EQ(std::string(buffer.begin(), buffer.end()), text);
+}
+
 TEST(Descriptions, OfRates)
 {
 	Texts texts;
 	for (const FrameRate rate : AllFrameRates())
+	{
 		texts.push_back(Text([=] { return FrameRateDescription(rate); }));
+		ExpectRateInBuffer<char>(rate);
+		ExpectRateInBuffer<zoncore::UTF16Char>(rate);
+	}
 	for (const std::int64_t ticks : {31'752'001LL, 31'752'000LL, 1LL, 0LL, -8'475'667'200LL})
 		texts.push_back(Text([=] { return FrameRateDescription(FrameRate(ticks)); }));
 	EXPECT_EQ(texts,
@@ -276,7 +292,13 @@ TEST(Descriptions, FillTranslationsOnce)
 			[&](std::string_view, UTF16String& outText) { return outText = UTF8to16(inTranslation), true; });
 		return UTF16to8(inDescribe());
 	};
-	EXPECT_EQ(translated("@0 @1 @0/s", [] { return FrameRateDescription(kFrameRate_VideoPAL); }), "25 @1 25/s");
+	const auto describeRate = []
+	{
+		ExpectRateInBuffer<char>(kFrameRate_VideoPAL);
+		ExpectRateInBuffer<zoncore::UTF16Char>(kFrameRate_VideoPAL);
+		return FrameRateDescription(kFrameRate_VideoPAL);
+	};
+	EXPECT_EQ(translated("@0 @1 @0/s", describeRate), "25 @1 25/s");
 	EXPECT_EQ(translated("@1@0", [] { return AudioChannelLayoutDescription(ReadLayout("Ls *")); }), "*@1@0");
 	EXPECT_EQ(translated("@1@0", [] { return AudioChannelConfigurationDescription({{}, {}}); }), "@102");
 	EXPECT_EQ(translated("@0-@1", [] { return PixelFormatDescription(Format("_0@c", 0)); }), "c@0_-@1");

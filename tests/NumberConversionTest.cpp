@@ -121,6 +121,7 @@ TEST(NumberToString, DropsZerosPadsAndChangesTheNotationOfLongText)
 	EXPECT_EQ(Format(-1'234'567.5, 1, 1, 0, 10), "-1234567.5");
 	EXPECT_EQ(Format(-1'234'567.5, 1, 1, 0, 9), "-1.23457e+06");
 	EXPECT_EQ(Format(7, 5, 0, 0, 5) + " " + Format(7, 5, 0, 0, 4), "00007 7");
+	EXPECT_EQ(Format(1, 3, 1'075, 0, 1'078) + " " + Format(1, 1, 1'075, 0, 1'076), "1 1");   // one character less each
 	EXPECT_EQ(Format(0.5, 1, 0, 0, INT_MIN), "0.5");
 	// Counts that no memory holds, and sums of counts that wrap
 	for (const unsigned long digits : {1ul, ULONG_MAX - 2, ULONG_MAX})

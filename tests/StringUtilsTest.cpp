@@ -118,7 +118,7 @@ TEST(ReplaceInString, ReplacesAllAndSearchesNothingTwice)
 	for (const auto& [text, what, with, expected] :
 		std::initializer_list<Case>{{"@0 of @1, @0", "@0", "two", "two of @1, two"}, {"aaaaa", "aa", "a", "aaa"},
 			{"aaa", "a", "aa", "aaaaaa"}, {"abc", "abc", "", ""}, {"abcabd", "abd", "-", "abc-"},
-			{"abc", "abcd", "y", "abc"}, {"abc", "", "y", "abc"}, {"", "a", "y", ""}})
+			{"abc", "a", "y", "ybc"}, {"abc", "abcd", "y", "abc"}, {"abc", "", "y", "abc"}, {"", "a", "y", ""}})
 	{
 		UTF16String replaced = AsciiToUTF16(text);
 		ReplaceInString(replaced, AsciiToUTF16(what), AsciiToUTF16(with));

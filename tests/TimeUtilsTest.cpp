@@ -68,6 +68,8 @@ TEST(LegacyRatioTime, IsExactUpToOneShortOfTheExtremes)
 {
 	EXPECT_EQ(RatioTimeToLegacyRatioTime({kMostInt - 1, 7}), LegacyRatioTime(kMostInt - 1, 7));
 	EXPECT_EQ(RatioTimeToLegacyRatioTime({-kMostInt + 1, 7}), LegacyRatioTime(-kMostInt + 1, 7));
+	EXPECT_EQ(RatioTimeToLegacyRatioTime({kMostInt - 1, kMostInt - 2}), LegacyRatioTime(kMostInt - 1, kMostInt - 2));
+	EXPECT_EQ(RatioTimeToLegacyRatioTime({-kMostInt + 1, kMostInt - 2}), LegacyRatioTime(-kMostInt + 1, kMostInt - 2));
 	EXPECT_EQ(RatioTimeToLegacyRatioTime(RatioTime(kMostInt)), LegacyRatioTime(kMostInt - 1));
 	EXPECT_EQ(RatioTimeToLegacyRatioTime({1, kMostInt}), LegacyRatioTime(1, kMostInt - 1));
 	EXPECT_EQ(RatioTimeToLegacyRatioTime({3'000'000'000, 9'000'000'001}), LegacyRatioTime(1, 3));
@@ -97,6 +99,9 @@ TEST(LegacyTimeScale, IsCorrected)
 	// 64-bit terms are exact or refused; this product fits because 999,999 is a multiple of 7.
 	EXPECT_EQ(CorrectLegacyRatioTimeAtTimeScale(RatioTime(1, kMost / 1'000'000 * 7), 0),
 		RatioTime(142'857, kMost / 1'000'000 * 1'000'000));
+	constexpr long long kMostFactor = kMost / 999'999;   // so does the largest product
+	EXPECT_EQ(
+		CorrectLegacyRatioTimeAtTimeScale(RatioTime(kMostFactor * 64), 0), RatioTime(kMostFactor * 999'999, 15'625));
 	EXPECT_THROW(CorrectLegacyRatioTimeAtTimeScale(RatioTime(kMost), 0), boost::bad_rational);
 	EXPECT_THROW(CorrectLegacyRatioTimeAtTimeScale(RatioTime(kLeast), 0), boost::bad_rational);
 	EXPECT_THROW(CorrectLegacyRatioTimeAtTimeScale(RatioTime(1, kMost), 0), boost::bad_rational);
