@@ -192,6 +192,17 @@ TEST(ManyChannels, CostTimeInProportion)
 	ASSERT_TRUE(RemapChannelOrdering(many, {many.rbegin(), many.rend()}, ordering));
 	EXPECT_TRUE(ordering[0] == 299'999 && ordering[299'999] == 299'998);
 	EXPECT_EQ(Convert(many, ReadLayout("Ls"))[0].back(), 1);
+
+	// Numbers without a name, a third of them twice: the first channel counts, and each is given once.
+	for (int i = 0; i < 300'000; ++i)
+		many[static_cast<std::size_t>(i)] = static_cast<AudioChannelLabel>(1'000 + i % 200'000);
+	ASSERT_TRUE(RemapChannelOrdering(many, {many.rbegin(), many.rend()}, ordering));
+	EXPECT_TRUE(ordering[0] == 99'999 && ordering[100'000] == 199'999 && ordering[299'999] == 0);
+	AudioChannelLayout labelled = CreateMultichannelLayout(300'000);
+	labelled.front() = many[7];
+	ASSERT_TRUE(ReplaceDiscreteLabelsWithDestinationLayoutLabels(labelled, many, labelled));
+	EXPECT_TRUE(labelled[7] == many[6] && labelled[8] == many[8] && labelled[199'999] == many[199'999]);
+	EXPECT_EQ(labelled[200'000], kAudioChannelLabel_Discrete);
 }
 
 }   // namespace

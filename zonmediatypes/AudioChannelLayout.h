@@ -192,12 +192,13 @@ ZONMEDIATYPES_API void ComputeChannelConversionMatrix(
 /// but an empty destination succeeds with an empty ordering whatever the source holds.
 ///
 /// A destination that repeats a label takes the same source channel each time: the ordering need not be a permutation.
+/// Takes time and memory as sorting the channels does.
 ZONMEDIATYPES_API bool RemapChannelOrdering(
 	const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, ChannelOrdering& outOrdering);
 
 /// Gives the `Discrete` channels of inSource, in order, those labels of inDestination that it does not carry yet, each
 /// once; its other channels stay as they are. False, and outLayout untouched, when no channel received a label. outLayout
-/// may be one of the inputs.
+/// may be one of the inputs. Takes time and memory as sorting the channels of both layouts does.
 ZONMEDIATYPES_API bool ReplaceDiscreteLabelsWithDestinationLayoutLabels(
 	const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, AudioChannelLayout& outLayout);
 

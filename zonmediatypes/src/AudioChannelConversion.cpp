@@ -6,6 +6,8 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <utility>
+#include <vector>
 
 namespace zonmediatypes
 {
@@ -100,6 +102,38 @@ std::size_t FindChannel(const AudioChannelLayout& inLayout, AudioChannelDescript
 	return static_cast<std::size_t>(std::ranges::find(inLayout, inLabel) - inLayout.begin());
 }
 
+// Finds the first channel with a label again and again. Few channels are searched from the start; many are sorted once, so
+// that no search takes longer than a few steps.
+class FirstChannels
+{
+public:
+	explicit FirstChannels(const AudioChannelLayout& inLayout) : mLayout(inLayout)
+	{
+		constexpr std::size_t kFew = 32;
+		if (inLayout.size() <= kFew)
+			return;
+		mSorted.reserve(inLayout.size());
+		for (std::size_t i = 0; i < inLayout.size(); ++i)
+			mSorted.emplace_back(inLayout[i], i);
+		std::ranges::sort(mSorted);
+	}
+
+	// The channel count when there is none.
+	std::size_t Find(AudioChannelDescription inLabel) const
+	{
+		if (mSorted.empty())
+			return FindChannel(mLayout, inLabel);
+		const auto found = std::ranges::lower_bound(mSorted, inLabel, {}, &LabelledChannel::first);
+		return found != mSorted.end() && found->first == inLabel ? found->second : mLayout.size();
+	}
+
+private:
+	using LabelledChannel = std::pair<AudioChannelDescription, std::size_t>;
+
+	const AudioChannelLayout& mLayout;
+	std::vector<LabelledChannel> mSorted;
+};
+
 ChannelConversionMatrix SilentMatrix(std::size_t inSourceCount, std::size_t inDestinationCount)
 {
 	ChannelConversionMatrix matrix;
@@ -193,11 +227,12 @@ bool RemapChannelOrdering(
 
 	ChannelOrdering ordering;
 	ordering.reserve(inDestination.size());
+	const FirstChannels labelled(inSource);
 	NumberedChannels numbered(inSource);
 	for (const AudioChannelDescription channel : inDestination)
 	{
 		const std::size_t found
-			= channel == kAudioChannelLabel_Discrete ? numbered.Next() : FindChannel(inSource, channel);
+			= channel == kAudioChannelLabel_Discrete ? numbered.Next() : labelled.Find(channel);
 		if (found == inSource.size())
 			return false;
 		ordering.push_back(found);
@@ -212,13 +247,14 @@ bool ReplaceDiscreteLabelsWithDestinationLayoutLabels(
 	AudioChannelLayout layout = inSource;
 	bool hasChanged = false;
 	auto unlabelled = std::ranges::find(layout, AudioChannelDescription());
-	for (const AudioChannelDescription channel : inDestination)
+	const FirstChannels carried(inSource);
+	const FirstChannels offered(inDestination);
+	for (std::size_t i = 0; i < inDestination.size() && unlabelled != layout.end(); ++i)
 	{
-		if (unlabelled == layout.end())
-			break;
-		if (HasChannelLabel(layout, channel.mLabel))   // always so for Discrete: there is an unlabelled channel left
+		// Every label that was offered before is carried by now, and so is Discrete: an unlabelled channel is left.
+		if (carried.Find(inDestination[i]) < inSource.size() || offered.Find(inDestination[i]) < i)
 			continue;
-		*unlabelled = channel;
+		*unlabelled = inDestination[i];
 		hasChanged = true;
 		unlabelled = std::find(unlabelled + 1, layout.end(), AudioChannelDescription());
 	}
