@@ -12,7 +12,7 @@
 namespace zonmediatypes
 {
 
-/// How a sample is stored: its bytes times ten.
+/// How many bytes a sample takes, times ten. It does not tell integers from floating point, nor the order of bytes.
 enum AudioSampleType : std::int32_t
 {
 	kAudioSampleType_Invalid = 0,

@@ -50,8 +50,9 @@ public:
 	constexpr FrameRate operator*(double inValue) const noexcept { return FrameRate(*this) *= inValue; }
 
 	/// The rate becomes inValue times slower: the duration is multiplied by inValue, wrapping for an integer; for a double
-	/// truncated toward zero, and the most negative duration for a product that is NaN or out of range. kFrameRate_Film24 / 1.001 is one tick short of kFrameRate_23976, because the product of
-	/// doubles is just below a whole number: use the constants where a rate must be exact.
+	/// truncated toward zero, and the most negative duration for a product that is NaN or out of range. 24, 30 and 60 fps
+	/// divided by 1.001 are one tick short of kFrameRate_23976, kFrameRate_VideoNTSC and kFrameRate_VideoNTSC_HD, because
+	/// the product of doubles is just below a whole number: use the constants where a rate must be exact.
 	constexpr FrameRate& operator/=(int inValue) noexcept;
 	constexpr FrameRate& operator/=(double inValue) noexcept;
 	constexpr FrameRate operator/(int inValue) const noexcept { return FrameRate(*this) /= inValue; }
@@ -66,6 +67,10 @@ private:
 };
 
 /// The rate of inFrames frames every inSeconds seconds. Does not compile when one frame is not a whole number of ticks.
+///
+/// A rate whose terms a file states is FrameRate(kTicksPerSecond * seconds / frames), exact where that division leaves no
+/// remainder; TimeBase::FromRatio(seconds, frames) of interop/TimeBase.h checks and rounds for any two terms. A rate that
+/// is stated as a decimal number, such as 29.97, stands for the nearest of AllFrameRates().
 consteval FrameRate FramesPerSecond(std::int64_t inFrames, std::int64_t inSeconds = 1)
 {
 	if (kTicksPerSecond * inSeconds % inFrames != 0)

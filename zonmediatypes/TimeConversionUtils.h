@@ -105,12 +105,15 @@ inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UT
 		outSamples, zoncore::UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
 }
 
-/// Bars-and-beats text as a position, rounded to the nearest sample: bar, ":", beat, and optionally "." and ticks, as
+/// Bars-and-beats text as a position: bar, ":", beat, and optionally "." and ticks, as
 /// in "5:3.120"; text without ":" is a bar alone. With iTicksPerBeat -1 what follows "." is a decimal fraction of a
 /// beat. The first ":" and the first "." count, wherever they stand: in "2:2.5" the 5 is five ticks.
 ///
 /// As a position bars and beats count from 1 and the first bar begins at dOffsetMilliseconds; as a duration they count
 /// from 0. A tempo, beat value or tick count of 0 has no meaningful result.
+///
+/// Samples are rounded by adding a half and truncating toward zero: to the nearest behind the first bar, and in front of
+/// it deliberately one later, whole samples too. "0:4" at 120 in 4/4 and 48 kHz is -23,999. A negative offset likewise.
 ZONMEDIATYPES_API std::int64_t ConvertBarsAndBeatsToSamples(
 	zoncore::UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration) noexcept;
 

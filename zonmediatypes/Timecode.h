@@ -33,11 +33,14 @@ namespace zonmediatypes
 
 enum TimecodeFlag : unsigned int
 {
-	kTimecodeFlag_OmitHours = 1,   ///< writes no hours
+	kTimecodeFlag_OmitHours
+	= 1,   ///< writes no hours, also where they are not 0 or carry what tells a negative time apart
 	kTimecodeFlag_TrimLeadingZeros
 	= 2,                          ///< leaves out leading fields that are zero, and the first field's leading zero
 	kTimecodeFlag_ShowSign = 4,   ///< writes "+" or "-" before a time that is not zero
-	kTimecodeFlag_LastFrame = 8   ///< shows the last frame of a range whose end is the time, and reads it as the end
+	/// Shows the last frame of a range whose end is the time, and reads it as the end. The end of an empty range at zero
+	/// shows as the frame before zero, "-00:00:00:01" with a sign.
+	kTimecodeFlag_LastFrame = 8
 };
 
 /// Timecode flags joined with `|`; bits that are no flag have no effect.
@@ -109,7 +112,8 @@ ZONMEDIATYPES_API std::size_t TimeToTimecode(std::span<char> outText, TickTime i
 ///
 /// Timecode, samples and milliseconds are a sign, which may be missing, and up to four groups of digits with ".", ":" or
 /// ";" between them, read from the right as frames, seconds, minutes and hours; after a last separator the group is 0.
-/// Nothing is range-checked: 99 minutes are 1 h 39 min.
+/// Nothing is range-checked: 99 minutes are 1 h 39 min. Digits are "0" to "9". Any other character is rejected, blanks
+/// around the text included, and so is an empty group between separators.
 ///
 /// One group alone is a run "HHMMSSFF" read from the right, with 2 digits for the frames of rates up to 100 fps, 3 up to
 /// 1,000, 4 up to 10,000 and 5 above. After a leading separator it is a count of frames at inRate, as it is at

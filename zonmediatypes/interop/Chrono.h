@@ -3,12 +3,13 @@
 /// \file
 /// TickTime and the durations of std::chrono.
 ///
-///     ToTickTime(std::chrono::milliseconds(40));                                  // one frame at 25 fps, exact
-///     ToTickTime(std::chrono::nanoseconds(1), Rounding::Nearest);                 // 254 ticks of 254.016
-///     ToDuration<std::chrono::milliseconds>(kTime_Max, Rounding::Down);           // 360000000 ms
+///     ToTickTime(std::chrono::milliseconds(40)).value();                          // one frame at 25 fps, exact
+///     ToTickTime(std::chrono::nanoseconds(1), Rounding::Nearest).value();         // 254 ticks of 254.016
+///     ToDuration<std::chrono::milliseconds>(kTime_Max, Rounding::Down).value();   // 360000000 ms
 ///
 /// Milliseconds, microseconds, hours and 1/90000 s are whole numbers of ticks and convert exactly; other periods, and every
-/// conversion away from ticks, name their rounding. A result that does not fit is empty.
+/// conversion away from ticks, name their rounding. Results are optional: one that does not fit is empty. kTime_Invalid is
+/// a time like any other, 400,000 s before zero: compare with it first.
 
 #include "zonmediatypes/interop/TimeBase.h"
 

@@ -10,6 +10,8 @@
 /// A conversion multiplies and divides in 128 bits where it must, so it is off by nothing but its rounding. Each is
 /// constexpr, allocates nothing and divides by multiplying, also where the time base is known at run time only: making one
 /// costs two divisions of 128 bits, so keep it. A product beyond 64 bits costs a division of 128 bits in each conversion.
+///
+/// kTime_Invalid is a time like any other here, 400,000 s before zero: compare with it first.
 
 #include "zoncore/Reciprocal.h"
 #include "zoncore/WrappingArithmetic.h"
@@ -39,7 +41,7 @@ public:
 	/// fraction in lowest terms, have a numerator that fits 64 bits.
 	static constexpr std::optional<TimeBase> FromRatio(std::int64_t inNumerator, std::int64_t inDenominator) noexcept;
 
-	/// The units that one frame or sample lasts; empty for a rate that is not usable or negative.
+	/// Units of one frame or one sample of inRate each; empty for a rate that is not usable or negative.
 	static constexpr std::optional<TimeBase> FromRate(FrameRate inRate) noexcept;
 
 	/// inTime in units; empty when that does not fit 64 bits.
