@@ -1,4 +1,5 @@
-// Channel conversion and layout descriptions beside what libswresample and libavutil do for the same layouts.
+// Channel conversion and layout descriptions beside what libswresample, libavutil and GStreamer do for the
+// same layouts.
 
 #include "Comparison.h"
 
@@ -8,6 +9,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <gst/audio/audio.h>
 #include <vector>
 
 extern "C"
@@ -57,6 +59,39 @@ Work PeerMatrix(AVChannelLayout inSource, AVChannelLayout inDestination)
 			return matrix[0];
 		});
 }
+
+// ---- Orders ----------------------------------------------------------------------------------------------------------
+
+Work Reordering(MakeLayout inSource, MakeLayout inDestination)
+{
+	return Repeat(
+		[source = inSource(), destination = inDestination(), ordering = ChannelOrdering()]() mutable
+		{
+			RemapChannelOrdering(source, destination, ordering);
+			return ordering.data();
+		});
+}
+
+template <std::size_t inChannels>
+using PeerPositions = std::array<GstAudioChannelPosition, inChannels>;
+
+template <std::size_t inChannels>
+Work PeerReordering(const PeerPositions<inChannels>& inSource, const PeerPositions<inChannels>& inDestination)
+{
+	return Repeat(
+		[=, ordering = std::array<gint, inChannels>()]() mutable
+		{
+			gst_audio_get_channel_reorder_map(inChannels, inSource.data(), inDestination.data(), ordering.data());
+			return ordering[0];
+		});
+}
+
+constexpr PeerPositions<6> kPeerBroadcast51{GST_AUDIO_CHANNEL_POSITION_FRONT_LEFT,
+	GST_AUDIO_CHANNEL_POSITION_FRONT_RIGHT, GST_AUDIO_CHANNEL_POSITION_FRONT_CENTER, GST_AUDIO_CHANNEL_POSITION_LFE1,
+	GST_AUDIO_CHANNEL_POSITION_REAR_LEFT, GST_AUDIO_CHANNEL_POSITION_REAR_RIGHT};
+constexpr PeerPositions<6> kPeerLegacy51{GST_AUDIO_CHANNEL_POSITION_FRONT_LEFT, GST_AUDIO_CHANNEL_POSITION_FRONT_RIGHT,
+	GST_AUDIO_CHANNEL_POSITION_REAR_LEFT, GST_AUDIO_CHANNEL_POSITION_REAR_RIGHT,
+	GST_AUDIO_CHANNEL_POSITION_FRONT_CENTER, GST_AUDIO_CHANNEL_POSITION_LFE1};
 
 // ---- Descriptions ----------------------------------------------------------------------------------------------------
 
@@ -131,14 +166,9 @@ constexpr auto sChannelCounts = std::to_array<std::size_t>({1, 10, 100, 1'000, 1
 				CreateIdentityChannelConversionMatrix(8, 8, matrix);
 				return matrix.data();
 			}));
-	Compare(kArea, "reordering, 5.1",
-		Repeat(
-			[source = CreateBroadcast51ChannelLayout(), destination = CreateLegacy51ChannelLayout(),
-				ordering = ChannelOrdering()]() mutable
-			{
-				RemapChannelOrdering(source, destination, ordering);
-				return ordering.data();
-			}));
+	Compare(kArea, "reordering, 5.1 (from source to destination there)",
+		Reordering(CreateBroadcast51ChannelLayout, CreateLegacy51ChannelLayout),
+		{{"GStreamer", PeerReordering(kPeerBroadcast51, kPeerLegacy51)}});
 	Compare(kArea, "description, stereo", Description(CreateStereoChannelLayout),
 		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_STEREO))}});
 	Compare(kArea, "description, 5.1 (a fixed name there)", Description(CreateBroadcast51ChannelLayout),

@@ -1,4 +1,4 @@
-// Timecode of 100,000 frames spread over a day, beside libavutil's.
+// Timecode of 100,000 frames spread over a day, beside libavutil's and GStreamer's.
 
 #include "Comparison.h"
 
@@ -7,6 +7,7 @@
 
 #include <array>
 #include <cstdint>
+#include <gst/video/video.h>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -108,7 +109,7 @@ Work FillColumn(MakeInputs inMakeInputs, Fill inFill)
 	};
 }
 
-// ---- The peer --------------------------------------------------------------------------------------------------------
+// ---- The peers -------------------------------------------------------------------------------------------------------
 
 Work PeerTextOut(const Case& inCase)
 {
@@ -127,6 +128,69 @@ Work PeerTextIn(const Case& inCase)
 			AVTimecode timecode;
 			av_timecode_init_from_string(&timecode, inCase.mAVRate, inText.mChars.data(), nullptr);
 			return timecode.start;
+		});
+}
+
+// A timecode of no day in particular.
+GstVideoTimeCode StreamerTimecode(const Case& inCase, guint inHours, guint inMinutes, guint inSeconds, guint inFrames)
+{
+	const bool isDropFrame = inCase.mAVFlags == AV_TIMECODE_FLAG_DROPFRAME;
+	GstVideoTimeCode timecode{};
+	gst_video_time_code_init(&timecode, static_cast<guint>(inCase.mAVRate.num), static_cast<guint>(inCase.mAVRate.den),
+		nullptr, isDropFrame ? GST_VIDEO_TIME_CODE_FLAGS_DROP_FRAME : GST_VIDEO_TIME_CODE_FLAGS_NONE, inHours,
+		inMinutes, inSeconds, inFrames, 0);
+	return timecode;
+}
+
+GstVideoTimeCode StreamerFields(const Case& inCase, int inFrame)
+{
+	GstVideoTimeCode timecode = StreamerTimecode(inCase, 0, 0, 0, 0);
+	gst_video_time_code_add_frames(&timecode, inFrame);
+	return timecode;
+}
+
+Work StreamerFieldsOut(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadFrames(inCase); },
+		[&inCase](int inFrame) { return StreamerFields(inCase, inFrame).frames; });
+}
+
+Work StreamerTextOut(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadFrames(inCase); },
+		[&inCase](int inFrame)
+		{
+			const GstVideoTimeCode timecode = StreamerFields(inCase, inFrame);
+			gchar* const text = gst_video_time_code_to_string(&timecode);
+			const char first = *text;
+			g_free(text);
+			return first;
+		});
+}
+
+Work StreamerFieldsIn(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadFields(inCase); },
+		[&inCase](const TimecodeFields& inFields)
+		{
+			const GstVideoTimeCode timecode
+				= StreamerTimecode(inCase, static_cast<guint>(inFields.mHours), static_cast<guint>(inFields.mMinutes),
+					static_cast<guint>(inFields.mSeconds), static_cast<guint>(inFields.mFrames));
+			return gst_video_time_code_frames_since_daily_jam(&timecode);
+		});
+}
+
+// Text has no rate: it makes fields, which count as frames once they have one.
+Work StreamerTextIn(const Case& inCase)
+{
+	return ForEach([&inCase] { return SpreadTexts<char>(inCase); },
+		[&inCase](const ShortText<char>& inText)
+		{
+			GstVideoTimeCode* const read = gst_video_time_code_new_from_string(inText.mChars.data());
+			const GstVideoTimeCode timecode
+				= StreamerTimecode(inCase, read->hours, read->minutes, read->seconds, read->frames);
+			gst_video_time_code_free(read);
+			return gst_video_time_code_frames_since_daily_jam(&timecode);
 		});
 }
 
@@ -219,13 +283,15 @@ Work FieldsIn(const Case& inCase)
 		const std::vector<Peer> out{{"libavutil", PeerTextOut(row), row.mWantedIntoBuffer}};
 		Compare(kArea, with("text into a buffer of char"), TextIntoBuffer<char>(row), out);
 		Compare(kArea, with("text into a buffer of UTF-16"), TextIntoBuffer<zoncore::UTF16Char>(row), out);
-		Compare(kArea, with("text as a string"), TextOut(row), {{"libavutil", PeerTextOut(row)}});
+		Compare(kArea, with("text as a string"), TextOut(row),
+			{{"libavutil", PeerTextOut(row)}, {"GStreamer", StreamerTextOut(row)}});
 		Compare(kArea, with("column of texts, a row"), TextColumn(row), {{"libavutil", PeerTextOut(row)}});
-		Compare(kArea, with("text in"), TextIn(row), {{"libavutil", PeerTextIn(row), 10}});
+		Compare(kArea, with("text in"), TextIn(row),
+			{{"libavutil", PeerTextIn(row), 10}, {"GStreamer", StreamerTextIn(row)}});
 		Compare(kArea, with("column of texts in, a row"), TextColumnIn(row), {{"libavutil", PeerTextIn(row), 10}});
-		Compare(kArea, with("fields"), FieldsOut(row));
+		Compare(kArea, with("fields"), FieldsOut(row), {{"GStreamer", StreamerFieldsOut(row)}});
 		Compare(kArea, with("column of fields, a row"), FieldsColumn(row));
-		Compare(kArea, with("fields in"), FieldsIn(row));
+		Compare(kArea, with("fields in"), FieldsIn(row), {{"GStreamer", StreamerFieldsIn(row)}});
 	}
 	const auto rates = [] { return std::vector<FrameRate>(AllFrameRates().begin(), AllFrameRates().end()); };
 	Compare(kArea, "description of a rate as a string",

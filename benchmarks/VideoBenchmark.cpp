@@ -1,5 +1,5 @@
-// Look-up, conversion cost, selection and sizes of pixel formats beside libavutil's counterparts, each over the same number
-// of formats: all of ours, and as many of libavutil's software formats.
+// Look-up, conversion cost, selection and sizes of pixel formats beside libavutil's and GStreamer's counterparts, each over
+// the same number of formats: all of ours, and as many of their software formats.
 
 #include "Comparison.h"
 
@@ -9,6 +9,8 @@
 
 #include <array>
 #include <cstddef>
+#include <cstdint>
+#include <gst/video/video.h>
 #include <string>
 #include <vector>
 
@@ -41,6 +43,27 @@ std::vector<AVPixelFormat> PeerFormats()
 		if ((descriptor->flags & AV_PIX_FMT_FLAG_HWACCEL) == 0)
 			formats.push_back(av_pix_fmt_desc_get_id(descriptor));
 	return formats;
+}
+
+// By number: the list of them would want the whole of GStreamer set up.
+std::vector<GstVideoFormat> StreamerFormats()
+{
+	std::vector<GstVideoFormat> formats;
+	for (std::size_t i = 0; i < OurFormats().size(); ++i)
+		formats.push_back(static_cast<GstVideoFormat>(GST_VIDEO_FORMAT_I420 + i));
+	return formats;
+}
+
+// The codes of the few formats that have one there, over and over.
+std::vector<std::uint32_t> StreamerCodes()
+{
+	std::vector<std::uint32_t> codes;
+	for (const GstVideoFormat format : StreamerFormats())
+		if (const std::uint32_t code = gst_video_format_to_fourcc(format); code != 0)
+			codes.push_back(code);
+	for (std::size_t i = 0; codes.size() < OurFormats().size(); ++i)
+		codes.push_back(codes[i]);
+	return codes;
 }
 
 // All pairs of a catalogue.
@@ -157,9 +180,13 @@ Work CustomLookup(std::size_t inRegistered)
 [[maybe_unused]] const bool sAdded = []
 {
 	constexpr const char* kArea = "Video";
-	Compare(kArea, "look-up by code",
+	Compare(kArea, "look-up by code (by number at libavutil)",
 		ForEach(OurFormats, [](PixelFormat inFormat) { return LookupPropertiesForName(inFormat.mName); }),
-		{{"libavutil", ForEach(PeerFormats, [](AVPixelFormat inFormat) { return av_pix_fmt_desc_get(inFormat); })}});
+		{{"libavutil", ForEach(PeerFormats, [](AVPixelFormat inFormat) { return av_pix_fmt_desc_get(inFormat); })},
+			{"GStreamer",
+				ForEach(StreamerCodes,
+					[](std::uint32_t inCode)
+					{ return gst_video_format_get_info(gst_video_format_from_fourcc(inCode)); })}});
 	Compare(kArea, "cost of a conversion, high quality", Cost(kRenderQuality_High), {{"libavutil", PeerLoss()}});
 	Compare(kArea, "cost of a conversion, low quality", Cost(kRenderQuality_Low), {{"libavutil", PeerLoss()}});
 	for (const std::size_t count : {8U, 74U})
@@ -173,11 +200,18 @@ Work CustomLookup(std::size_t inRegistered)
 		ForEach(OurFormats, [](PixelFormat inFormat) { return UncompressedPixelFormatRowBytes(inFormat, kWidth); }),
 		{{"libavutil",
 			ForEach(PeerFormats, [](AVPixelFormat inFormat) { return av_image_get_linesize(inFormat, kWidth, 0); })}});
-	Compare(kArea, "frame size",
+	Compare(kArea, "frame size (with strides and offsets at GStreamer)",
 		ForEach(OurFormats, [](PixelFormat inFormat) { return PixelFormatSize(inFormat, kWidth, kHeight); }),
 		{{"libavutil",
-			ForEach(PeerFormats,
-				[](AVPixelFormat inFormat) { return av_image_get_buffer_size(inFormat, kWidth, kHeight, 64); })}});
+			 ForEach(PeerFormats,
+				 [](AVPixelFormat inFormat) { return av_image_get_buffer_size(inFormat, kWidth, kHeight, 64); })},
+			{"GStreamer",
+				ForEach(StreamerFormats,
+					[info = GstVideoInfo()](GstVideoFormat inFormat) mutable
+					{
+						gst_video_info_set_format(&info, inFormat, kWidth, kHeight);
+						return info.size;
+					})}});
 
 	constexpr auto kListSizes = std::to_array<std::size_t>({1, 10, 100, 1'000});
 	Grow("nearest between two lists of so many formats, a pair", kListSizes, NearestBetweenLists);
