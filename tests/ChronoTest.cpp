@@ -75,6 +75,7 @@ TEST(TimeBase, IsARatioOrEmpty)
 	EXPECT_TRUE(ntsc.IsExact());
 	EXPECT_FALSE(TimeBase::FromRatio(7, 11).value().IsExact());
 	EXPECT_EQ(TimeBase::FromRatio(7, 11).value().ToRatio(), (TimeBase::Ratio{7, 11}));
+	EXPECT_EQ(TimeBase::FromRatio(14, 22), TimeBase::FromRatio(7, 11));
 	EXPECT_FALSE(TimeBase::FromRatio(0, 1) || TimeBase::FromRatio(1, 0) || TimeBase::FromRatio(-1, -1));
 	EXPECT_FALSE(TimeBase::FromRatio(kMax, 1));
 	for (const std::int64_t duration : {std::int64_t{0}, std::int64_t{-5}, kMax})

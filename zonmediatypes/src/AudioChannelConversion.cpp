@@ -231,8 +231,7 @@ bool RemapChannelOrdering(
 	NumberedChannels numbered(inSource);
 	for (const AudioChannelDescription channel : inDestination)
 	{
-		const std::size_t found
-			= channel == kAudioChannelLabel_Discrete ? numbered.Next() : labelled.Find(channel);
+		const std::size_t found = channel == kAudioChannelLabel_Discrete ? numbered.Next() : labelled.Find(channel);
 		if (found == inSource.size())
 			return false;
 		ordering.push_back(found);
