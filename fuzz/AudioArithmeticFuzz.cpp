@@ -8,8 +8,8 @@
 
 #include <algorithm>
 #include <array>
-#include <cmath>
-#include <numeric>
+#include <iterator>
+#include <span>
 
 namespace
 {
@@ -45,28 +45,72 @@ void CheckPairs(FuzzInput& ioInput)
 		Require(isKnown || partner == kAudioChannelLabel_Discrete, "only labels have partners");
 		Require(std::find(labels.begin(), labels.end(), partner) != labels.end(), "partners are labels");
 	}
+	const AudioChannelLabel mirrored = LeftRightPair(label);
+	const bool hasMirror = mirrored != kAudioChannelLabel_Discrete;
+	Require(!hasMirror || (mirrored != label && LeftRightPair(mirrored) == label), "left and right are mutual");
+	Require(IsStereoPair(label, mirrored) == hasMirror, "left and right are a stereo pair");
 	Require(IsStereoPair(label, other) == IsStereoPair(other, label), "stereo pairs have no order");
+}
+
+// The source channel for a destination channel: the first of its label, the k-th Discrete for the k-th Discrete; the
+// channel count when there is none.
+std::size_t FindSource(const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, std::size_t inIndex)
+{
+	const AudioChannelDescription label = inDestination[inIndex];
+	const auto before = std::span(inDestination).first(label == AudioChannelDescription() ? inIndex : 0);
+	auto rest = std::count(before.begin(), before.end(), label);
+	for (std::size_t i = 0; i < inSource.size(); ++i)
+	{
+		if (inSource[i] == label && rest-- == 0)
+			return i;
+	}
+	return inSource.size();
+}
+
+bool HasSpeaker(AudioChannelDescription inChannel)
+{
+	return inChannel != kAudioChannelLabel_Discrete && inChannel != kAudioChannelLabel_LowFrequency
+		&& inChannel != kAudioChannelLabel_LFE2;
+}
+
+bool IsUnlabelled(const AudioChannelLayout& inLayout)
+{
+	return std::ranges::count(inLayout, AudioChannelDescription()) == std::ssize(inLayout);
 }
 
 void CheckConversion(FuzzInput& ioInput)
 {
 	const AudioChannelLayout source = TakeLayout(ioInput), destination = TakeLayout(ioInput);
-	ChannelConversionMatrix matrix{{77}};
+	ChannelConversionMatrix matrix{{77}}, identity{{77}};
 	ComputeChannelConversionMatrix(source, destination, matrix);
-	Require(matrix.size() == destination.size(), "a row for each destination channel");
-	for (const auto& row : matrix)
-	{
-		Require(row.size() == source.size(), "a gain for each source channel");
-		const double sum = std::accumulate(row.begin(), row.end(), 0.0);
-		Require(sum == 0 || std::abs(sum - 1) < 1e-12, "a channel is fed once or not at all");
-		Require(row.empty() || *std::min_element(row.begin(), row.end()) >= 0, "gains are shares");
-	}
+	CreateIdentityChannelConversionMatrix(source.size(), destination.size(), identity);
+	Require(matrix.size() == destination.size() && identity.size() == destination.size(), "destinations have rows");
+	const bool isLabelled
+		= source.size() == 1 || destination.size() == 1 || (!IsUnlabelled(source) && !IsUnlabelled(destination));
+	Require(isLabelled || matrix == identity, "without labels channels keep their numbers");
+	const bool hasSpeaker = std::ranges::any_of(source, HasSpeaker);
 	for (std::size_t i = 0; i < destination.size(); ++i)
 	{
-		const auto found = std::find(source.begin(), source.end(), destination[i]);
-		const bool isFed = destination[i] != AudioChannelDescription() && found != source.end();
-		if (isFed)
-			Require(matrix[i][static_cast<std::size_t>(found - source.begin())] == 1, "equal labels are connected");
+		const auto& row = matrix[i];
+		Require(row.size() == source.size() && identity[i].size() == source.size(), "a gain for each source channel");
+		for (std::size_t k = 0; k < source.size(); ++k)
+			Require(identity[i][k] == (i == k ? 1 : 0), "the identity connects equal numbers");
+		if (!isLabelled)
+			continue;
+		const auto fed = std::ssize(row) - std::ranges::count(row, 0.0);
+		const double share = fed == 0 ? 0 : 1.0 / static_cast<double>(fed);
+		Require(std::ranges::count(row, share) >= fed, "a channel is fed in equal shares");
+		const bool isNumbered = destination[i] == AudioChannelDescription();
+		const std::size_t found = FindSource(source, destination, i);
+		if (source.size() == 1 && IsUnlabelled(source))
+			Require(row[0] == 1, "one channel without a label feeds all");
+		else if (found < source.size())
+			Require(row[found] == 1, "equal labels and numbers are connected");
+		else if (isNumbered)
+			Require(
+				fed == (destination.size() == 1 ? std::ssize(source) : 0), "numbers are mixed into one channel only");
+		else
+			Require((fed > 0) == (hasSpeaker && HasSpeaker(destination[i])), "speakers are fed by speakers");
 	}
 }
 
@@ -76,27 +120,36 @@ void CheckOrdering(FuzzInput& ioInput)
 	for (const AudioChannelDescription channel : destination)
 		Require(HasChannelLabel(source, channel.mLabel) == (std::count(source.begin(), source.end(), channel) > 0),
 			"labels are found");
-	ChannelOrdering ordering{77};
-	if (RemapChannelOrdering(source, destination, ordering))
-	{
-		Require(ordering.size() == destination.size(), "an index for each destination channel");
-		for (std::size_t i = 0; i < ordering.size(); ++i)
-			Require(source.at(ordering[i]) == destination[i], "the same label");
-	}
-	else
-	{
-		Require(ordering == ChannelOrdering{77}, "a refusal changes nothing");
-	}
+	ChannelOrdering expected, ordering{77};
+	for (std::size_t i = 0; i < destination.size(); ++i)
+		expected.push_back(FindSource(source, destination, i));
+	const bool isPossible = destination.empty()
+		|| (source.size() == destination.size() && std::ranges::count(expected, source.size()) == 0);
+	Require(RemapChannelOrdering(source, destination, ordering) == isPossible, "what has its labels is an ordering");
+	Require(ordering == (isPossible ? expected : ChannelOrdering{77}), "labels have their places, or all is left");
 
 	AudioChannelLayout labelled{kAudioChannelLabel_LFE2}, itself = source;
 	const bool isChanged = ReplaceDiscreteLabelsWithDestinationLayoutLabels(source, destination, labelled);
 	const bool isItselfChanged = ReplaceDiscreteLabelsWithDestinationLayoutLabels(itself, destination, itself);
 	Require(isChanged == isItselfChanged && itself == (isChanged ? labelled : source), "the output may be the input");
-	Require(isChanged || labelled == AudioChannelLayout{kAudioChannelLabel_LFE2}, "a refusal changes nothing");
-	Require(
-		ContainsSameChannelsIgnoreOrder(source, destination) == ContainsSameChannelsIgnoreOrder(destination, source),
+	AudioChannelLayout rest;   // the labels that are given, each once and in order
+	for (const AudioChannelDescription channel : destination)
+	{
+		if (channel != AudioChannelDescription() && !HasChannelLabel(source, channel.mLabel)
+			&& !HasChannelLabel(rest, channel.mLabel))
+			rest.push_back(channel);
+	}
+	AudioChannelLayout stepwise = source;
+	for (std::size_t i = 0, given = 0; i < source.size() && given < rest.size(); ++i)
+		stepwise[i] = source[i] == AudioChannelDescription() ? rest[given++] : source[i];
+	Require(isChanged == (stepwise != source), "a layout changes where a channel has no label and a label is left");
+	Require(labelled == (isChanged ? stepwise : AudioChannelLayout{kAudioChannelLabel_LFE2}),
+		"channels receive the missing labels in order");
+	Require(ContainsSameChannelsIgnoreOrder(source, destination) == std::ranges::is_permutation(source, destination),
 		"sets have no order");
-	Require(RemapChannelOrdering(source, source, ordering), "every layout is an ordering of itself");
+	AudioChannelLayout turned = source;
+	std::ranges::reverse(turned);
+	Require(ContainsSameChannelsIgnoreOrder(source, turned), "a layout is the same the other way round");
 }
 
 std::size_t CountLabels(const ChannelMap& inMap)
@@ -119,6 +172,23 @@ void CheckMove(ChannelMap& ioMap, AudioChannelLabel inLabel, std::int32_t inChan
 		return Require(after == taken, "a label is taken away once");
 	Require(after == taken || after == taken + 1, "a label is put in once");
 	Require(HasChannelLabel(ioMap.GetChannelLayout(ioMap.Find(inChannel)), inLabel), "the channel has the label");
+}
+
+// What the map says of labels and channels, entry by entry.
+void CheckRouting(const ChannelMap& inMap, AudioChannelLabel inLabel)
+{
+	const auto count = static_cast<std::int32_t>(inMap.GetNumberOfChannels());
+	std::size_t assignments = 0;
+	std::int32_t source = -1;
+	for (std::int32_t i = count - 1; i >= 0; --i)
+	{
+		if (inMap[i] >= 0 && inMap[i] < count)
+			assignments += inMap.GetChannelLayout(inMap[i]).size();
+		if (HasChannelLabel(inMap.GetChannelLayout(i), inLabel))
+			source = inMap[i];
+	}
+	Require(inMap.GetNumberOfAssignments() == assignments, "assignments are the labels of the channels assigned to");
+	Require(inMap.GetSourceChannelIndexForChannelLabel(inLabel) == source, "the first entry with a label counts");
 }
 
 // Changes one entry of a map, and requires that the others stay.
@@ -175,8 +245,8 @@ void CheckMap(FuzzInput& ioInput)
 		Require(map.GetSourceChannelIndexForChannelLabelIndex(index)
 				== (atPlace.empty() ? -2 : map.GetSourceChannelIndexForChannelLabel(atPlace.front().mLabel)),
 			"a place is as good as its label");
+		CheckRouting(map, label);
 	}
-	Require(map.GetNumberOfAssignments() <= map.GetNumberOfChannels() * CountLabels(map), "channels have their labels");
 	Require(ChannelMap(map) == map, "copies are equal");
 }
 
@@ -204,9 +274,17 @@ void CheckFormat(FuzzInput& ioInput)
 	Require(count == 0 ? format.GetSampleAlignment() == 0 : format.GetSampleAlignment() % count == 0,
 		"every channel takes as many bytes");
 	const AudioChannelLayout before = format.GetChannelLayout();
+	const AudioChannelDescription channel = TakeLabel(ioInput);
+	for (const AudioChannelDescription label : {channel, before.empty() ? channel : before.back()})
+		Require(format.GetChannelIndex(label)
+				== static_cast<std::size_t>(std::ranges::find(before, label) - before.begin()),
+			"the first channel of a label is found");
+	for (std::size_t i = 0; i <= count; ++i)
+		Require(format.GetChannelDescription(i) == (i < count ? before[i] : AudioChannelDescription()),
+			"channels have their labels");
 	NormalizeChannelOrder(format);
 	const AudioChannelLayout& layout = format.GetChannelLayout();
-	Require(ContainsSameChannelsIgnoreOrder(before, layout), "no channel is lost");
+	Require(std::ranges::is_permutation(before, layout), "no channel is lost");
 	Require(std::is_sorted(layout.begin(), layout.end()), "channels are in order");
 }
 

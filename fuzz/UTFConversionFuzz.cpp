@@ -100,7 +100,11 @@ void CheckBytes(FuzzInput& ioInput)
 
 	const UTF16String ascii = AsciiToUTF16(bytes);
 	Require(ascii.size() == bytes.size(), "ASCII has as many characters as bytes");
-	Require(ascii.find(0xFFFD) != UTF16String::npos || ascii == wide, "ASCII is UTF-8");
+	for (std::size_t i = 0; i < bytes.size(); ++i)
+	{
+		const auto byte = static_cast<unsigned char>(bytes[i]);
+		Require(ascii[i] == (byte < 0x80 ? byte : 0xFFFD), "ASCII is kept, and nothing else is");
+	}
 }
 
 void CheckUnits(FuzzInput& ioInput)
