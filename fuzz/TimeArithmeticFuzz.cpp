@@ -34,6 +34,27 @@ std::int64_t Wrapped(Exact inValue)
 	return static_cast<std::int64_t>(static_cast<std::uint64_t>(low));
 }
 
+// Requires a count of ticks that went through double: truncated, the most negative one where it does not fit. Two roundings
+// of a double are allowed for.
+void RequireThroughDouble(std::int64_t inTicks, long double inExact)
+{
+	const long double size = std::abs(inExact), slack = size * 0x1p-51L;
+	if (!(size - slack < 0x1p63L))
+		return Require(inTicks == INT64_MIN, "what does not fit is the most negative count");
+	const long double ticks = std::abs(static_cast<long double>(inTicks));
+	if (inTicks != INT64_MIN || size + slack < 0x1p63L)   // near to 2^63 either may be
+		Require(ticks <= size + slack && ticks > size - slack - 1 && (inTicks == 0 || (inTicks < 0) == (inExact < 0)),
+			"products and quotients are truncated");
+}
+
+void RequireRatio(double inRatio, std::int64_t inDividend, std::int64_t inDivisor)
+{
+	const long double dividend = static_cast<long double>(inDividend);
+	Require(std::abs(static_cast<long double>(inRatio) * static_cast<long double>(inDivisor) - dividend)
+			<= std::abs(dividend) * 0x1p-50L,
+		"ratios are quotients");
+}
+
 void CheckTime(FuzzInput& ioInput)
 {
 	const TickTime time(ioInput.Edge<std::int64_t>()), other(ioInput.Edge<std::int64_t>());
@@ -50,11 +71,12 @@ void CheckTime(FuzzInput& ioInput)
 	if (unsignedFactor != 0)
 		Require((time / unsignedFactor).GetTicks() == Wrapped(exact / unsignedFactor), "so are unsigned ones");
 	if (const auto divisor = ioInput.Any<double>(); divisor != 0)
-		static_cast<void>(time / divisor);
-	static_cast<void>(time * ioInput.Any<double>());
+		RequireThroughDouble((time / divisor).GetTicks(), static_cast<long double>(time.GetTicks()) / divisor);
+	const auto scale = ioInput.Any<double>();
+	RequireThroughDouble((time * scale).GetTicks(), static_cast<long double>(time.GetTicks()) * scale);
 	Require(TickTime(time).Abs() == (time < kTime_Zero ? -time : time), "magnitudes wrap");
 	if (other != kTime_Zero)
-		Require(!std::isnan(time / other), "times have a ratio");
+		RequireRatio(time / other, time.GetTicks(), other.GetTicks());
 }
 
 void CheckFrames(FuzzInput& ioInput)
@@ -66,6 +88,10 @@ void CheckFrames(FuzzInput& ioInput)
 	moved.AddFrames(frames, rate);
 	Require(
 		moved.GetTicks() == Wrapped(Exact(time.GetTicks()) + Exact(frames) * rate.GetTicksPerFrame()), "frames wrap");
+
+	const std::int64_t number = rate.IsUsable() ? Wrapped(Exact(time.GetTicks()) / rate.GetTicksPerFrame()) : 0;
+	Require(time.ToFrame64(rate) == number, "a time lies in the frame of the truncated quotient");
+	Require(time.ToFrame32(rate) == static_cast<std::int32_t>(number), "of which the low 32 bits count");
 
 	TickTime aligned = time, ceiling = time, nearest = time;
 	aligned.AlignToFrame(rate);
@@ -105,9 +131,15 @@ void CheckRate(FuzzInput& ioInput)
 	if (factor != 0)
 		Require(
 			(rate * factor).GetTicksPerFrame() == Wrapped(Exact(rate.GetTicksPerFrame()) / factor), "faster ones, too");
-	static_cast<void>(rate * ioInput.Any<double>());
-	static_cast<void>(rate / ioInput.Any<double>());
-	static_cast<void>(GetFrameRateRatio(rate, TakeRate(ioInput)));
+	const auto faster = ioInput.Any<double>(), slower = ioInput.Any<double>();
+	const auto duration = static_cast<long double>(rate.GetTicksPerFrame());
+	RequireThroughDouble((rate * faster).GetTicksPerFrame(), duration / faster);
+	RequireThroughDouble((rate / slower).GetTicksPerFrame(), duration * slower);
+	const FrameRate other = TakeRate(ioInput);
+	if (const double ratio = GetFrameRateRatio(rate, other); rate.GetTicksPerFrame() != 0)
+		RequireRatio(ratio, other.GetTicksPerFrame(), rate.GetTicksPerFrame());
+	else
+		Require(ratio == 0, "without a duration there is no ratio");
 	const zoncore::UTF16String description = FrameRateDescription(rate);
 	Require(!description.empty(), "every rate has a description");
 	RequireInBuffers(description, [rate](auto outText) { return FrameRateDescription(outText, rate); });
@@ -128,6 +160,11 @@ void CheckDisplay(FuzzInput& ioInput)
 		!IsTimeDisplayDropFrame(display) || IsDropFrameApplicableForTimeDisplay(display), "drop frames are applicable");
 	static_cast<void>(TimeDisplayDescription(display));
 	const FrameRate counted = GetFrameRateForTimeDisplay(display, rate);
+	if (const FrameRate own = GetFrameRateForTimeDisplay(display, {}); own.IsUsable())
+		Require(counted == own
+				&& GetTimeDisplayForFrameRate(own, IsTimeDisplayDropFrame(display), false, kTimeDisplay_Auto, true)
+					== display,
+			"a display's own rate finds the display");
 	Require(!IsTimeDisplayDropFrame(display) || counted == kFrameRate_VideoNTSC || counted == kFrameRate_VideoNTSC_HD,
 		"drop frames are those of NTSC");
 	const auto displays = AllTimeDisplays();
