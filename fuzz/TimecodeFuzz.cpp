@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdlib>
 #include <span>
 #include <vector>
 
@@ -129,6 +130,23 @@ void CheckWriting(FuzzInput& ioInput)
 		"text has only digits, separators and signs");
 	Require(!text.empty() && text.size() <= kLongestTimecode, "there is always a text, and none is longer");
 	RequireInBuffers(text, [&](auto outText) { return TimeToTimecode(outText, time, rate, display, flags); });
+	const bool isTimecode = IsHMSFTimeDisplay(display, false) && display < kTimeDisplay_Auto;
+	const bool isWhole
+		= (flags & (kTimecodeFlag_OmitHours | kTimecodeFlag_TrimLeadingZeros | kTimecodeFlag_LastFrame)) == 0;
+	if (const bool hasSign = (flags & kTimecodeFlag_ShowSign) != 0; isTimecode && isWhole)
+	{
+		unsigned hours = 99, minutes = 99, seconds = 99;
+		unsigned long long frames = 99;
+		bool isNegative = false;
+		TimeToHMSF(hours, minutes, seconds, frames, isNegative, time, rate, display);
+		Require(ReadNumbers(text)
+				== Numbers{time < kTime_Zero && !hasSign ? 23 - hours : hours, minutes, seconds,
+					static_cast<std::int64_t>(frames)},
+			"the text shows the fields");
+		Require((text.front() == '-') == (hasSign && time < kTime_Zero), "and the sign that is asked for");
+		Require(
+			(text.find(';') != UTF16String::npos) == IsTimeDisplayDropFrame(display), "drop frames have their mark");
+	}
 	const RatioTime seconds = TimeToRatioTime(time);
 	Require(RatioTimeToTimecode(seconds, rate, display, flags)
 			== TimeToTimecode(RatioTimeToTime(seconds), rate, display, flags),
@@ -165,6 +183,27 @@ void CheckRoundTrip(FuzzInput& ioInput)
 		"the text shows the fields");
 }
 
+// How a display with a rate of its own numbers its frames.
+struct Numbering
+{
+	explicit Numbering(TimeDisplay inDisplay)
+		: mDuration(GetFrameRateForTimeDisplay(inDisplay, {}).GetTicksPerFrame()),
+		  mNominal((kTicksPerSecond + mDuration - 1) / mDuration),
+		  mDropped(IsTimeDisplayDropFrame(inDisplay) ? mNominal / 15 : 0)
+	{
+	}
+
+	// The first label of a minute that drops it counts as the frame that the minute begins with.
+	std::int64_t FrameOf(std::int64_t inSeconds, std::int64_t inFrames) const
+	{
+		const std::int64_t minutes = inSeconds / 60;
+		const bool isFirst = minutes % 10 != 0 && inSeconds % 60 == 0 && inFrames == 0;
+		return inSeconds * mNominal + inFrames - mDropped * (minutes - minutes / 10 - (isFirst ? 1 : 0));
+	}
+
+	std::int64_t mDuration, mNominal, mDropped;
+};
+
 void CheckFields(FuzzInput& ioInput)
 {
 	const FrameRate rate = TakeRate(ioInput);
@@ -178,6 +217,32 @@ void CheckFields(FuzzInput& ioInput)
 	static_cast<void>(HMSFToTime(hours, minutes, seconds, frames, isNegative, rate, display));
 	static_cast<void>(HMSFToTime(ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>(), ioInput.Edge<unsigned>(),
 		ioInput.Edge<unsigned long long>(), ioInput.Flag(), rate, display));
+
+	const FrameRate own = GetFrameRateForTimeDisplay(display, {});
+	if (!own.IsUsable())
+		return;
+	const Numbering numbering(display);
+	const std::int64_t label = static_cast<std::int64_t>(frames), day = numbering.FrameOf(86'400, 0);
+	const std::int64_t number = time.ToFrame64(own);
+	Require(label < numbering.mNominal, "frames are below the count of a second");
+	Require(numbering.FrameOf((hours * 60 + minutes) * 60 + seconds, label) == std::abs(number % day),
+		"fields stand for the frame of the day");
+	Require(isNegative == (IsTimeDisplayDropFrame(display) ? time < kTime_Zero : number < 0), "fields have a sign");
+
+	// Too large fields carry at the display's own rate.
+	const auto manyHours = ioInput.Any<std::uint16_t>(), manyMinutes = ioInput.Any<std::uint16_t>(),
+			   manySeconds = ioInput.Any<std::uint16_t>();
+	std::int64_t rest = ioInput.Any<std::uint32_t>(), total = (manyHours * 60ll + manyMinutes) * 60 + manySeconds;
+	const TickTime carried = HMSFToTime(
+		manyHours, manyMinutes, manySeconds, static_cast<unsigned long long>(rest), isNegative, own, display);
+	if (rest > kTicksPerSecond / own.GetTicksPerFrame())
+	{
+		total += rest / numbering.mNominal;
+		rest %= numbering.mNominal;
+	}
+	TickTime expected;
+	expected.AddFrames(numbering.FrameOf(total % 86'400, rest), own);
+	Require(carried == (isNegative ? -expected : expected), "more frames than a second has carry");
 }
 
 // Every row of a column is what the function for one gives; the shorter span counts.
