@@ -8,6 +8,8 @@
 #include "zonmediatypes/PixelFormatUtils.h"
 
 #include <algorithm>
+#include <array>
+#include <cstdlib>
 #include <iterator>
 #include <utility>
 
@@ -75,8 +77,18 @@ void CheckSelection(FuzzInput& ioInput)
 	const RenderQuality quality = TakeQuality(ioInput);
 	const PixelFormats sources = TakeFormats(ioInput), destinations = TakeFormats(ioInput);
 	const PixelFormat request = TakeFormat(ioInput);
-	const int cost = PixelConversionCost(request.mProperties, TakeFormat(ioInput).mProperties, quality);
-	Require(cost >= 0 && cost <= kPixelConversionCost_Impossible, "costs are in their range");
+	const PixelFormatProperties from = request.mProperties, other = TakeFormat(ioInput).mProperties;
+	for (const PixelFormatProperties to : {other, from})
+	{
+		const int cost = PixelConversionCost(from, to, quality);
+		const bool isKnown = from.IsConcrete() && !from.HasUnknownCompression();
+		if (isKnown && from == to)
+			Require(cost == 0, "no conversion costs nothing");
+		else if (isKnown && to.IsConcrete() && !to.IsCompressed())
+			Require(cost > 0 && cost < kPixelConversionCost_Impossible, "a conversion costs something");
+		else
+			Require(cost == kPixelConversionCost_Impossible, "what is not known or is compressed is out of reach");
+	}
 
 	const PixelFormat nearest = SelectNearestSourcePixelFormat(sources, request.mProperties, quality);
 	Require(
@@ -109,6 +121,17 @@ void CheckSelection(FuzzInput& ioInput)
 		"only DV is decompressed");
 }
 
+// The bits of a pixel of an uncompressed format with rows; 0 for other formats.
+std::int64_t BitsPerPixel(PixelFormatProperties inProperties)
+{
+	constexpr std::array<std::int64_t, 8> kBits{8, 10, 15, 16, 24, 32, 0, 0};
+	const std::int64_t bits = kBits[inProperties.BitDepth()];
+	if (inProperties.IsConcrete() && inProperties.Subsampling() == kPixelFormatSubsampling_422)
+		return 2 * bits;
+	const bool is444 = inProperties.IsConcrete() && inProperties.Subsampling() == kPixelFormatSubsampling_444;
+	return is444 && !inProperties.IsCompressed() ? (inProperties.Is4444() ? 4 : 3) * bits : 0;
+}
+
 void CheckSizes(FuzzInput& ioInput)
 {
 	const PixelFormat format = TakeFormat(ioInput);
@@ -120,6 +143,13 @@ void CheckSizes(FuzzInput& ioInput)
 	const PixelFormatProperties properties = format.mProperties;
 	if (properties.IsConcrete() && !properties.IsCompressed())
 		Require(size == row * height && row % 16 == 0, "a frame is its rows, which are padded");
+	if (const std::int64_t bits = width * BitsPerPixel(properties); isOrdinary && bits > 0 && row > 0)
+	{
+		// Of 16 bits 15 are used at least; v210 stores groups of six pixels and pads by up to 127 bytes.
+		Require(
+			row * 8 >= bits && (row - 16 - 127) * 8 * 15 <= bits * 16, "a row has room for its pixels, and no more");
+		Require(row <= UncompressedPixelFormatRowBytes(format, width + 1), "wider rows are no shorter");
+	}
 	int fixedWidth = -1, fixedHeight = -2;
 	FixedSizedFormatDimensions(format, fixedWidth, fixedHeight);
 	Require(format.mProperties.IsDV() ? fixedWidth > 0 && fixedHeight > 0 : fixedWidth == -1 && fixedHeight == -2,
@@ -128,6 +158,17 @@ void CheckSizes(FuzzInput& ioInput)
 	const bool isValid = IsRectValidForFormat(format, width, height, ratio);
 	Require(properties.IsDV() ? !isValid || (width == fixedWidth && height == fixedHeight) : isValid,
 		"only DV demands a size");
+}
+
+// Requires that a width is inWidth * inNumerator / inDenominator rounded, where that fits.
+void RequireScaled(std::int64_t inResult, std::int64_t inWidth, std::int64_t inNumerator, std::int64_t inDenominator)
+{
+	if (inNumerator == 0 || inDenominator == 0)
+		return Require(inResult == inWidth, "a ratio with a term of 0 changes nothing");
+	if (inWidth <= 0 || inWidth * inNumerator / inDenominator >= INT32_MAX)
+		return;
+	const std::int64_t distance = std::abs(inResult * inDenominator - inWidth * inNumerator);
+	Require(distance * 2 <= inDenominator + inDenominator / 1'024, "a width is scaled and rounded");
 }
 
 void CheckRatios(FuzzInput& ioInput)
@@ -158,6 +199,8 @@ void CheckRatios(FuzzInput& ioInput)
 	const auto other = AdjustSquarePixelRectToPixelAspectRect(second, a);
 	const auto otherSize = AdjustSquarePixelDimensionToPixelAspectDimension({second.right, second.bottom}, a);
 	Require(otherSize.x == other.right && otherSize.y == second.bottom, "and back");
+	RequireScaled(square.right, second.right, a.GetNumerator(), a.GetDenominator());
+	RequireScaled(other.right, second.right, a.GetDenominator(), a.GetNumerator());
 	Require(!VideoFrameSizeDescription(second, a).empty(), "every frame size has a description");
 }
 
