@@ -1,6 +1,7 @@
 #include "zoncore/MessageCatalogue.h"
 
 #include "tests/Allocations.h"
+#include "tests/CatalogueFile.h"
 #include "tests/WithTranslator.h"
 #include "zoncore/StringUtils.h"
 
@@ -14,7 +15,6 @@
 #include <string_view>
 #include <unistd.h>
 #include <utility>
-#include <vector>
 
 namespace
 {
@@ -23,35 +23,9 @@ using namespace zoncore;
 using namespace zoncore::config;
 
 using testing::HasSubstr;
-using Messages = std::vector<std::pair<std::string, std::string>>;
-
-std::string Word(std::size_t inValue, bool inHighestFirst = false)
-{
-	std::string bytes;
-	for (unsigned i = 0; i < 4; ++i)
-		bytes.push_back(static_cast<char>(inValue >> 8 * (inHighestFirst ? 3 - i : i)));
-	return bytes;
-}
-
-// The file of a catalogue with these messages, in this order: seven words, two tables of lengths and offsets, the texts.
-std::string MakeCatalogue(const Messages& inMessages, bool inHighestFirst = false)
-{
-	const std::size_t tableBytes = 8 * inMessages.size();
-	std::string bytes, texts;
-	for (const std::size_t word : {std::size_t{0x950412DE}, std::size_t{0}, inMessages.size(), std::size_t{28},
-			 28 + tableBytes, std::size_t{0}, std::size_t{0}})
-		bytes += Word(word, inHighestFirst);
-	for (const auto text : {&Messages::value_type::first, &Messages::value_type::second})
-	{
-		for (const auto& message : inMessages)
-		{
-			bytes += Word((message.*text).size(), inHighestFirst)
-				+ Word(28 + 2 * tableBytes + texts.size(), inHighestFirst);
-			texts += message.*text + '\0';
-		}
-	}
-	return bytes + texts;
-}
+using zontest::MakeCatalogue;
+using zontest::Messages;
+using zontest::Word;
 
 const Messages::value_type kHeader = {"", "Content-Type: text/plain; charset=UTF-8\n"};
 const Messages kGerman = {kHeader, {"$$$/a/Draft\4Draft", "Entwurf"}, {"$$$/a/Draft2\4Draft", "Entwurf 2"},
