@@ -95,7 +95,11 @@ void RunTogether(const std::vector<std::function<void(int)>>& inJobs)
 
 TEST(Threads, UseAllSharedStateAtOnce)
 {
-	std::atomic<int> reports = 0, contracts = 0, assertions = 0, translations = 0, translated = 0;
+	std::atomic<int> reports = 0;
+	std::atomic<int> contracts = 0;
+	std::atomic<int> assertions = 0;
+	std::atomic<int> translations = 0;
+	std::atomic<int> translated = 0;
 	const auto hooks = std::make_shared<int>();   // each hook that is alive holds one
 	const auto reporter = [&, hooks](auto, auto, auto&) { ++reports; };
 	const auto contractDialog = [&, hooks](auto...) { return ++contracts, false; };
@@ -106,7 +110,8 @@ TEST(Threads, UseAllSharedStateAtOnce)
 	SetErrorReporter(reporter);
 	debug::SetContractDialog(contractDialog);
 	debug::SetAssertDialog(assertDialog);
-	const auto french = CatalogueWith("Brouillon"), danish = CatalogueWith("Kladde");
+	const auto french = CatalogueWith("Brouillon");
+	const auto danish = CatalogueWith("Kladde");
 	CheckRegistry& checks = CheckRegistry::Get();
 	std::atomic<bool> isDisabled = false;
 	std::mutex mutex;
