@@ -4,11 +4,14 @@
 #include "Comparison.h"
 
 #include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/AudioChannelMap.h"
+#include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Descriptions.h"
 
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <gst/audio/audio.h>
 #include <vector>
 
@@ -93,6 +96,90 @@ constexpr PeerPositions<6> kPeerLegacy51{GST_AUDIO_CHANNEL_POSITION_FRONT_LEFT, 
 	GST_AUDIO_CHANNEL_POSITION_REAR_LEFT, GST_AUDIO_CHANNEL_POSITION_REAR_RIGHT,
 	GST_AUDIO_CHANNEL_POSITION_FRONT_CENTER, GST_AUDIO_CHANNEL_POSITION_LFE1};
 
+bool SamePeerChannels(const PeerPositions<6>& inFirst, const PeerPositions<6>& inSecond)
+{
+	guint64 first = 0;
+	guint64 second = 0;
+	return gst_audio_channel_positions_to_mask(inFirst.data(), 6, FALSE, &first) != FALSE
+		&& gst_audio_channel_positions_to_mask(inSecond.data(), 6, FALSE, &second) != FALSE && first == second;
+}
+
+// ---- Channel maps ----------------------------------------------------------------------------------------------------
+
+ChannelMap MapOf(const AudioChannelLayout& inLayout)
+{
+	ChannelMap map(inLayout);
+	for (std::int32_t i = 0; i < static_cast<std::int32_t>(inLayout.size()); ++i)
+		map.SetChannel(i, i);
+	return map;
+}
+
+Work ChannelOfLabel()
+{
+	return ForEach(CreateVST22_2ChannelLayout,
+		[map = MapOf(CreateVST22_2ChannelLayout())](AudioChannelDescription inChannel)
+		{ return map.GetSourceChannelIndexForChannelLabel(inChannel.mLabel); });
+}
+
+Work PeerChannelOfLabel()
+{
+	const AVChannelLayout layout = PeerLayout(AV_CH_LAYOUT_22POINT2);
+	const auto channels = [layout]
+	{
+		std::vector<AVChannel> result;
+		for (unsigned i = 0; i < 24; ++i)
+			result.push_back(av_channel_layout_channel_from_index(&layout, i));
+		return result;
+	};
+	return ForEach(
+		channels, [layout](AVChannel inChannel) { return av_channel_layout_index_from_channel(&layout, inChannel); });
+}
+
+// ---- Formats ---------------------------------------------------------------------------------------------------------
+
+constexpr auto kRates = std::to_array<int>({44'100, 48'000});
+constexpr auto kChannelCounts = std::to_array<int>({1, 2, 6, 8});
+
+std::vector<AudioFormat> Formats()
+{
+	std::vector<AudioFormat> formats;
+	for (const int rate : kRates)
+		for (const int channels : kChannelCounts)
+			formats.push_back(AudioFormat::CreateAudioFormat(
+				CreateMultichannelLayoutWithDefaultLabels(static_cast<unsigned>(channels)),
+				static_cast<std::uint32_t>(rate)));
+	return formats;
+}
+
+std::vector<GstAudioInfo> PeerFormats()
+{
+	std::vector<GstAudioInfo> formats;
+	for (const int rate : kRates)
+		for (const int channels : kChannelCounts)
+		{
+			std::array<GstAudioChannelPosition, 8> positions{};
+			gst_audio_channel_positions_from_mask(
+				channels, gst_audio_channel_get_fallback_mask(channels), positions.data());
+			gst_audio_info_set_format(&formats.emplace_back(), GST_AUDIO_FORMAT_F32, rate, channels, positions.data());
+		}
+	return formats;
+}
+
+// All pairs, of a format with itself too.
+template <class MakeFormats, class Call>
+Work EveryPair(MakeFormats inMakeFormats, Call inCall)
+{
+	return [inMakeFormats, inCall](benchmark::State& ioState)
+	{
+		const auto formats = inMakeFormats();
+		for (auto _ : ioState)
+			for (const auto& first : formats)
+				for (const auto& second : formats)
+					benchmark::DoNotOptimize(inCall(first, second));
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(formats.size() * formats.size()));
+	};
+}
+
 // ---- Descriptions ----------------------------------------------------------------------------------------------------
 
 Work Description(MakeLayout inLayout)
@@ -169,6 +256,29 @@ constexpr auto sChannelCounts = std::to_array<std::size_t>({1, 10, 100, 1'000, 1
 	Compare(kArea, "reordering, 5.1 (from source to destination there)",
 		Reordering(CreateBroadcast51ChannelLayout, CreateLegacy51ChannelLayout),
 		{{"GStreamer", PeerReordering(kPeerBroadcast51, kPeerLegacy51)}});
+	Compare(kArea, "whether channels are the same in any order, 5.1",
+		Repeat([first = CreateBroadcast51ChannelLayout(), second = CreateLegacy51ChannelLayout()]
+			{ return ContainsSameChannelsIgnoreOrder(first, second); }),
+		{{"GStreamer",
+			Repeat([first = kPeerBroadcast51, second = kPeerLegacy51] { return SamePeerChannels(first, second); })}});
+	Compare(kArea, "channel of a label in a map, 22.2 (in a layout there)", ChannelOfLabel(),
+		{{"libavutil", PeerChannelOfLabel()}});
+	Compare(kArea, "default channel map, 5.1", Repeat([] { return ChannelMap::CreateDefaultChannelMap(6); }));
+	Compare(kArea, "label of a map to another channel, 5.1",
+		Repeat(
+			[map = MapOf(CreateBroadcast51ChannelLayout()), channel = 0]() mutable
+			{
+				channel = (channel + 1) % 6;
+				map.SetDeviceChannelIndexForChannelLabel(kAudioChannelLabel_LowFrequency, channel);
+				return map.GetNumberOfChannels();
+			}));
+	Compare(kArea, "whether formats are equal", EveryPair(Formats, std::equal_to<>()),
+		{{"GStreamer",
+			EveryPair(PeerFormats,
+				[](const GstAudioInfo& inFirst, const GstAudioInfo& inSecond)
+				{ return gst_audio_info_is_equal(&inFirst, &inSecond); })}});
+	Compare(kArea, "order of formats, exact", EveryPair(Formats, AudioFormatExactCompare()));
+	Compare(kArea, "order of formats, simple", EveryPair(Formats, AudioFormatSimpleCompare()));
 	Compare(kArea, "description, stereo", Description(CreateStereoChannelLayout),
 		{{"libavutil", PeerDescription(PeerLayout(AV_CH_LAYOUT_STEREO))}});
 	Compare(kArea, "description, 5.1 (a fixed name there)", Description(CreateBroadcast51ChannelLayout),

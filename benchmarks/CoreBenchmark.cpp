@@ -1,16 +1,21 @@
-// The core layer beside the standard library: each pair of functions does the same work on the same data.
+// The core layer beside the C and C++ libraries: each pair of functions does the same work on the same data.
 
 #include "Comparison.h"
 
 #include "zoncore/Localizer.h"
+#include "zoncore/MessageCatalogue.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/SmallBlockAllocator.h"
 #include "zoncore/StringUtils.h"
+#include "zonmediatypes/Descriptions.h"
 
 #include <array>
+#include <clocale>
 #include <cstddef>
 #include <cstdio>
 #include <cstdlib>
+#include <libintl.h>
+#include <memory>
 #include <new>
 #include <string>
 #include <vector>
@@ -69,6 +74,59 @@ Work ManyBlocks(std::size_t inSize)
 	};
 }
 
+// ---- Translations ----------------------------------------------------------------------------------------------------
+
+constexpr const char* kDomain = "zonmediatypes";
+
+std::vector<std::string_view> Keys()
+{
+	return {zonmediatypes::AllTextKeys().begin(), zonmediatypes::AllTextKeys().end()};
+}
+
+std::shared_ptr<const config::MessageCatalogue> German()
+{
+	auto catalogue = std::make_shared<config::MessageCatalogue>();
+	std::string error;
+	catalogue->Load(std::string(ZON_CATALOGUES "/de/LC_MESSAGES/") + kDomain + ".mo", error);
+	return catalogue;
+}
+
+Work FindMessage()
+{
+	return ForEach(Keys, [german = German()](std::string_view inKey) { return german->Find(inKey); });
+}
+
+Work LookupWithCatalogue()
+{
+	return [](benchmark::State& ioState)
+	{
+		config::Localizer::Get().SetCatalogue(German());
+		ForEach(Keys, [](std::string_view inKey) { return config::Localizer::Get().Lookup(inKey); })(ioState);
+		config::Localizer::Get().SetCatalogue(nullptr);
+	};
+}
+
+// The peer takes a key as a catalogue has it, and translates in no locale that is called "C".
+Work PeerFindMessage()
+{
+	const auto keys = []
+	{
+		std::vector<std::string> result;
+		for (const std::string_view key : Keys())
+			result.emplace_back(key).at(key.find('=')) = '\4';
+		return result;
+	};
+	return [keys](benchmark::State& ioState)
+	{
+		std::setlocale(LC_MESSAGES, "C.UTF-8");
+		setenv("LANGUAGE", "de", 1);
+		bindtextdomain(kDomain, ZON_CATALOGUES);
+		bind_textdomain_codeset(kDomain, "UTF-8");
+		ForEach(keys, [](const std::string& inKey) { return dgettext(kDomain, inKey.c_str()); })(ioState);
+		std::setlocale(LC_MESSAGES, "C");
+	};
+}
+
 [[maybe_unused]] const bool sAdded = []
 {
 	constexpr const char* kArea = "Core";
@@ -89,6 +147,23 @@ Work ManyBlocks(std::size_t inSize)
 	Compare(kArea, "template with three texts filled in",
 		Repeat([texts = std::array{AsciiToUTF16("1920"), AsciiToUTF16("1080"), AsciiToUTF16("1.0")}]() -> UTF16String
 			{ return ZString("$$$/zonmediatypes/VideoFrameSizeFormatPAR=@0w @1h (@2)", texts); }));
+	Compare(kArea, "template with three texts filled into a buffer (of char there)",
+		Repeat([pattern = AsciiToUTF16("@0w @1h (@2)"),
+				   texts = std::array{AsciiToUTF16("1920"), AsciiToUTF16("1080"), AsciiToUTF16("1.0")},
+				   text = std::array<UTF16Char, 40>()]() mutable
+			{ return FillPlaceholders(std::span(text), pattern, texts); }),
+		{{"snprintf",
+			Repeat(
+				[texts = std::array<std::string, 3>{"1920", "1080", "1.0"}, text = std::array<char, 40>()]() mutable
+				{
+					return std::snprintf(
+						text.data(), text.size(), "%sw %sh (%s)", texts[0].c_str(), texts[1].c_str(), texts[2].c_str());
+				})}});
+	if (German()->GetSize() != 0)   // where gettext compiled it
+	{
+		Compare(kArea, "message of a catalogue", FindMessage(), {{"gettext", PeerFindMessage()}});
+		Compare(kArea, "look-up of a text with a catalogue", LookupWithCatalogue());
+	}
 	for (const auto& [name, character] :
 		{std::pair("1,000 ASCII characters", "x"), std::pair("1,000 x \"€\"", "\u20AC")})
 	{

@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 extern "C"
@@ -61,10 +62,11 @@ Work TextOut(TimecodeFormat inFormat)
 		});
 }
 
+template <class Char>
 Work TextIntoBuffer(TimecodeFormat inFormat)
 {
 	return ForEach(Samples,
-		[inFormat, text = std::array<UTF16Char, kLongestPosition>()](std::int64_t inSamples) mutable
+		[inFormat, text = std::array<Char, kLongestPosition>()](std::int64_t inSamples) mutable
 		{
 			const BeatInfo beats;
 			return ConvertSamplesToTimecode(
@@ -145,13 +147,26 @@ Work PeerTextIn(int inFlags)
 	for (const Case& row : kCases)
 	{
 		const std::vector<Peer> out{{"libavutil", PeerTextOut(row.mPeerFlags)}};
-		Compare(kArea, std::string(row.mName) + " text into a buffer", TextIntoBuffer(row.mFormat), out);
+		Compare(kArea, std::string(row.mName) + " text into a buffer of char", TextIntoBuffer<char>(row.mFormat), out);
+		Compare(kArea, std::string(row.mName) + " text into a buffer of UTF-16", TextIntoBuffer<UTF16Char>(row.mFormat),
+			out);
 		Compare(kArea, std::string(row.mName) + " text as a string", TextOut(row.mFormat), out);
 		Compare(kArea, std::string(row.mName) + " text in", TextIn(row.mFormat),
 			{{"libavutil", PeerTextIn(row.mPeerFlags)}});
 	}
-	Compare(kArea, "bars and beats", TextOut(kTimecodeFormat_BarsAndBeats));
-	Compare(kArea, "bars and beats in", TextIn(kTimecodeFormat_BarsAndBeats));
+	for (const auto& [name, format] : std::to_array<std::pair<const char*, TimecodeFormat>>({
+			 {"bars and beats", kTimecodeFormat_BarsAndBeats},
+			 {"beats", kTimecodeFormat_Beats},
+			 {"decimal time", kTimecodeFormat_Decimal},
+			 {"milliseconds", kTimecodeFormat_Milliseconds},
+			 {"frame count", kTimecodeFormat_Frames},
+			 {"timecode with hundredths of a frame", kTimecodeFormat_TimecodeSubframes},
+		 }))
+	{
+		Compare(kArea, name, TextOut(format));
+		Compare(kArea, std::string(name) + " into a buffer of char", TextIntoBuffer<char>(format));
+		Compare(kArea, std::string(name) + " in", TextIn(format));
+	}
 	return true;
 }();
 

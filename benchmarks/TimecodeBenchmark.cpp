@@ -3,6 +3,7 @@
 #include "Comparison.h"
 
 #include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/PulldownCadenceUtils.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <array>
@@ -42,6 +43,14 @@ constexpr auto sCases = std::to_array<Case>({
 		AV_TIMECODE_FLAG_DROPFRAME, 12},
 	{"59.94 drop-frame", kTimeDisplay_5994DropTimecode, kFrameRate_VideoNTSC_HD, {60'000, 1'001},
 		AV_TIMECODE_FLAG_DROPFRAME, 12},
+});
+
+// Displays that the peers do not have.
+constexpr auto sCountCases = std::to_array<Case>({
+	{"feet and frames of 35 mm film", kTimeDisplay_35mmFeetFrames, kFrameRate_Film24, {}, 0, 0},
+	{"feet and frames of 16 mm film", kTimeDisplay_16mmFeetFrames, kFrameRate_Film24, {}, 0, 0},
+	{"frame count", kTimeDisplay_Frames, kFrameRate_VideoPAL, {}, 0, 0},
+	{"milliseconds", kTimeDisplay_Milliseconds, kFrameRate_VideoPAL, {}, 0, 0},
 });
 
 // The frame numbers, in an order that keeps the processor from learning the digits that follow.
@@ -227,6 +236,21 @@ Work TextIn(const Case& inCase)
 		{ return TimecodeToTime(inText.Get(), inCase.mRate, inCase.mDisplay); });
 }
 
+// Texts of any length.
+Work LongTextIn(const Case& inCase)
+{
+	const auto texts = [&inCase]
+	{
+		std::vector<zoncore::UTF16String> result;
+		for (const TickTime time : SpreadTimes(inCase))
+			result.push_back(TimeToTimecode(time, inCase.mRate, inCase.mDisplay));
+		return result;
+	};
+	return ForEach(texts,
+		[&inCase](const zoncore::UTF16String& inText)
+		{ return TimecodeToTime(inText, inCase.mRate, inCase.mDisplay); });
+}
+
 Work TextColumnIn(const Case& inCase)
 {
 	return [&inCase](benchmark::State& ioState)
@@ -274,6 +298,14 @@ Work FieldsIn(const Case& inCase)
 		});
 }
 
+Work FilmToVideo(PulldownCadence inCadence)
+{
+	static constexpr Case kFilm{"", kTimeDisplay_23976Timecode, kFrameRate_23976, {}, 0, 0};
+	return ForEach([] { return SpreadTimes(kFilm); },
+		[inCadence, isSplit = false](TickTime inTime) mutable
+		{ return MapPulldownFrameTo2997Frame(inTime, kFrameRate_VideoNTSC, inCadence, isSplit); });
+}
+
 [[maybe_unused]] const bool sAdded = []
 {
 	constexpr const char* kArea = "Timecode";
@@ -293,6 +325,15 @@ Work FieldsIn(const Case& inCase)
 		Compare(kArea, with("column of fields, a row"), FieldsColumn(row));
 		Compare(kArea, with("fields in"), FieldsIn(row), {{"GStreamer", StreamerFieldsIn(row)}});
 	}
+	for (const Case& row : sCountCases)
+	{
+		const auto with = [&row](const char* inWhat) { return std::string(inWhat) + ", " + row.mName; };
+		Compare(kArea, with("text into a buffer of char"), TextIntoBuffer<char>(row));
+		Compare(kArea, with("text as a string"), TextOut(row));
+		Compare(kArea, with("text in"), LongTextIn(row));
+	}
+	Compare(kArea, "film frame to video frame, cadence WWSSW", FilmToVideo(kPulldownCadence_WWSSW));
+	Compare(kArea, "film frame to video frame, cadence WWWSW", FilmToVideo(kPulldownCadence_Advanced_WWWSW));
 	const auto rates = [] { return std::vector<FrameRate>(AllFrameRates().begin(), AllFrameRates().end()); };
 	Compare(kArea, "description of a rate as a string",
 		ForEach(rates, [](FrameRate inRate) { return FrameRateDescription(inRate); }));

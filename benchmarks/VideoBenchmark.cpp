@@ -3,6 +3,7 @@
 
 #include "Comparison.h"
 
+#include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelFormatSelection.h"
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
@@ -212,6 +213,8 @@ Work CustomLookup(std::size_t inRegistered)
 						gst_video_info_set_format(&info, inFormat, kWidth, kHeight);
 						return info.size;
 					})}});
+
+	Compare(kArea, "description", ForEach(OurFormats, PixelFormatDescription));
 
 	constexpr auto kListSizes = std::to_array<std::size_t>({1, 10, 100, 1'000});
 	Grow("nearest between two lists of so many formats, a pair", kListSizes, NearestBetweenLists);
