@@ -4,6 +4,7 @@
 #include "SampleClockInput.h"
 
 #include <cmath>
+#include <string>
 
 namespace
 {
@@ -46,6 +47,30 @@ void CheckWriting(FuzzInput& ioInput)
 	Require(isWritten == (text != sBefore), "text is written whole or not at all");
 }
 
+// Requires that the text of some numbers, counted from 0, is written half a tick behind their position and read as it.
+void RequireNumbers(FuzzInput& ioInput, const BeatInfo& inBeats, double inSampleRate, bool inIsDuration)
+{
+	const std::int64_t bar = ioInput.Any<std::int16_t>();
+	const auto beat = static_cast<std::int32_t>(ioInput.Below(static_cast<std::size_t>(inBeats.iBeatsPerBar)));
+	const std::int32_t tick = ioInput.Any<std::uint16_t>() % inBeats.iTicksPerBeat, base = inIsDuration ? 0 : 1;
+	const std::string digits = std::to_string(tick);
+	const std::size_t mostDigits = std::to_string(inBeats.iTicksPerBeat - 1).size();
+	const UTF16String numbers = zoncore::utility::AsciiToUTF16(std::to_string(bar + base) + ":"
+		+ std::to_string(beat + base) + "." + std::string(mostDigits - digits.size(), '0') + digits);
+
+	const long double perTick = 240.0L * inSampleRate / inBeats.dTempo / inBeats.iBeatValue / inBeats.iTicksPerBeat;
+	const std::int64_t ticks = (bar * inBeats.iBeatsPerBar + beat) * inBeats.iTicksPerBeat + tick;
+	const long double offset = inIsDuration ? 0 : inBeats.dOffsetMilliseconds * inSampleRate / 1'000;
+	const long double position = offset + static_cast<long double>(ticks) * perTick;
+	UTF16String text;
+	ConvertSamplesToBarsAndBeats(
+		text, static_cast<double>(position + perTick / 2), inSampleRate, inBeats, inIsDuration, 2);
+	Require(text == numbers, "a position is written in its numbers");
+	const auto read = ConvertBarsAndBeatsToSamples(numbers, inSampleRate, inBeats, inIsDuration);
+	const long double distance = std::abs(static_cast<long double>(read) - position);
+	Require(distance < (ticks < 0 ? 1.50001L : 0.50001L), "numbers are read as their sample");
+}
+
 // What a usual meter writes reads back within the tick that was cut off and the sample that is rounded to.
 void CheckRoundTrip(FuzzInput& ioInput)
 {
@@ -58,13 +83,15 @@ void CheckRoundTrip(FuzzInput& ioInput)
 	beats.dOffsetMilliseconds = ioInput.Any<std::uint8_t>();
 	const bool isDuration = ioInput.Flag();
 	const double offset = isDuration ? 0 : beats.dOffsetMilliseconds * kSampleRate / 1'000;
-	const double samples = std::ceil(offset) + ioInput.Any<std::uint32_t>();
+	const double distance = ioInput.Any<std::uint32_t>();
+	const double samples = std::ceil(offset) + (ioInput.Flag() ? -distance : distance);
 	UTF16String text;
 	ConvertSamplesToBarsAndBeats(text, samples, kSampleRate, beats, isDuration, 2);
 	const std::int64_t again = ConvertBarsAndBeatsToSamples(text, kSampleRate, beats, isDuration);
 	const double samplesPerTick = kSampleRate * 60 / beats.dTempo * 4 / beats.iBeatValue / beats.iTicksPerBeat;
 	Require(
 		std::abs(static_cast<double>(again) - samples) <= samplesPerTick + 1, "bars and beats are exact to the tick");
+	RequireNumbers(ioInput, beats, kSampleRate, isDuration);
 }
 
 // Both writers and both styles of a position agree.
