@@ -82,7 +82,9 @@ void CheckReading(FuzzInput& ioInput)
 	std::int64_t samples = 1, again = 2, plain = 3;
 	Require(
 		ConvertTimecodeToSamples(samples, text, format, sampleRate, frameRate, nullptr, false), "no beats are needed");
-	Require(ConvertTimecodeToSamples(again, UTF16StringView(text), format, sampleRate, frameRate, nullptr, true),
+	const UTF16String longer = text + UTF16String{'7', ':', '7'};
+	Require(ConvertTimecodeToSamples(
+				again, UTF16StringView(longer).substr(0, text.size()), format, sampleRate, frameRate, nullptr, true),
 		"a view is as good");
 	Require(samples == again, "a view gives the same, and durations are positions");
 	Require(!text.empty() || samples == -1, "empty text is no value");
@@ -183,6 +185,11 @@ void CheckLabels(FuzzInput& ioInput)
 	UTF16String text;
 	ConvertSamplesToTimecode(text, samples, static_cast<std::int32_t>(sampleRate), meaning.mFormat,
 		static_cast<std::int32_t>(frameRate), nullptr, false);
+	UTF16String negative;
+	ConvertSamplesToTimecode(negative, -samples, static_cast<std::int32_t>(sampleRate), meaning.mFormat,
+		static_cast<std::int32_t>(frameRate), nullptr, false);
+	const bool hasSign = samples > 0 && !meaning.mIsCount;
+	Require(negative == (hasSign ? UTF16Char{'-'} + text : text), "a negative position is one with a sign in front");
 	const bool isScaled = meaning.mIsDropFrame || meaning.mIsNTSC;
 	const std::int64_t numerator = frameRate * (isScaled ? 1'000 : 1),
 					   denominator = sampleRate * (isScaled ? 1'001 : 1);
