@@ -149,7 +149,8 @@ void CheckOrdering(FuzzInput& ioInput)
 		"sets have no order");
 	AudioChannelLayout turned = source;
 	std::ranges::reverse(turned);
-	Require(ContainsSameChannelsIgnoreOrder(source, turned), "a layout is the same the other way round");
+	Require(ContainsSameChannelsIgnoreOrder(source, turned) && RemapChannelOrdering(source, turned, ordering),
+		"a layout has the same channels the other way round");
 }
 
 std::size_t CountLabels(const ChannelMap& inMap)
