@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <cstdio>
 #include <cstdlib>
+#include <vector>
 
 namespace zonfuzz
 {
@@ -23,12 +24,18 @@ inline void Require(
 /// A target is a list of checks. Each takes its arguments off the input and requires what must hold for them.
 using Check = void (*)(FuzzInput& ioInput);
 
+/// Which checks of the target have run, for the replay to tell what its inputs never reach; empty for a target without.
+inline std::vector<bool> sReachedChecks;
+
 /// Runs the check that the first byte chooses on the bytes behind it. Returns what the fuzzer expects of a target.
 template <std::size_t inCount>
 int RunOneOf(const Check (&inChecks)[inCount], const std::uint8_t* inData, std::size_t inSize)
 {
 	FuzzInput input(inData, inSize);
-	inChecks[input.Below(inCount)](input);
+	const std::size_t chosen = input.Below(inCount);
+	sReachedChecks.resize(inCount);
+	sReachedChecks[chosen] = true;
+	inChecks[chosen](input);
 	return 0;
 }
 

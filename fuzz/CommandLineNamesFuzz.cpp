@@ -6,7 +6,10 @@
 #include "zonmedia/VideoNames.h"
 
 #include <algorithm>
+#include <array>
+#include <cstdlib>
 #include <cstring>
+#include <numeric>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -190,11 +193,42 @@ void CheckLists(FuzzInput& ioInput)
 	Require(ReadLayout(abbreviations) == layout, "a list of abbreviations is the channels in order");
 }
 
+// What is spelled from numbers is read as them.
+void CheckSpelled(FuzzInput& ioInput)
+{
+	const std::int64_t numerator = 1 + ioInput.Any<std::uint16_t>(), denominator = 1 + ioInput.Any<std::uint16_t>();
+	const std::string over = std::to_string(numerator) + "/" + std::to_string(denominator);
+	const Rate rate = ReadRate(over);
+	const std::int64_t common = std::gcd(numerator, denominator), ticks = kTicksPerSecond * denominator;
+	Require(rate.mStated == Fraction{numerator / common, denominator / common}, "a rate is stated as it is spelled");
+	Require(
+		std::abs(rate.mRate.GetTicksPerFrame() * numerator - ticks) * 2 <= numerator, "and has the nearest duration");
+	Require(rate.mIsRounded == (ticks % numerator != 0), "which may be exact");
+	const PixelAspectRatio shape = ReadPixelAspectRatio(over);
+	Require(shape.GetNumerator() == numerator && shape.GetDenominator() == denominator, "a shape is read as spelled");
+	const auto size = ReadSize(std::to_string(numerator) + "x" + std::to_string(denominator));
+	Require(size.x == numerator && size.y == denominator, "so is a size");
+	constexpr std::array<std::string_view, 5> kQualities{"draft", "low", "medium", "high", "max"};
+	const std::size_t quality = ioInput.Below(kQualities.size());
+	Require(ReadQuality(kQualities[quality]) == static_cast<RenderQuality>(quality + 1), "so is a quality");
+
+	// A frame of a day, at the rate of the form or at any.
+	const TimeForm form = ioInput.OneOf(TimeForms()).mValue;
+	const FrameRate any = ioInput.OneOf(AllFrameRates());
+	const FrameRate counted = form.mDisplay ? GetFrameRateForTimeDisplay(*form.mDisplay, any) : any;
+	const bool isWhole = counted.IsUsable() && kTicksPerSecond % counted.GetTicksPerFrame() == 0;
+	TickTime time(ioInput.Any<std::int64_t>() % (86'399 * kTicksPerSecond));
+	time.AlignToFrame(counted);
+	if (counted.IsUsable() && time.ToFrame64(counted) == time.ToFrame32(counted)
+		&& (isWhole || form.mDisplay != kTimeDisplay_AudioSamples))
+		Require(ReadTime(TimeText(time, counted, form), counted, form) == time, "so is a time");
+}
+
 }   // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize)
 {
 	return zonfuzz::RunOneOf({CheckRate, CheckTime, CheckLayout, CheckForm, CheckDistance, CheckFormats, CheckSize,
-								 CheckShape, CheckQuality, CheckRewriting, CheckLists},
+								 CheckShape, CheckQuality, CheckRewriting, CheckLists, CheckSpelled},
 		inData, inSize);
 }

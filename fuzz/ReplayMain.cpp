@@ -1,5 +1,7 @@
 // Runs a fuzz target over the files of the folders that are named on the command line: a regression test of every input
-// that once mattered.
+// that once mattered. It fails where an invariant does not hold, and where no input reaches one of the target's checks.
+
+#include "Checks.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -7,6 +9,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <string>
 #include <vector>
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t inSize);
@@ -23,6 +26,15 @@ void Replay(const std::filesystem::path& inPath)
 	LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
 }
 
+// The numbers of the checks that no input chose, each behind a blank.
+std::string UnreachedChecks()
+{
+	std::string numbers;
+	for (std::size_t i = 0; i < zonfuzz::sReachedChecks.size(); ++i)
+		numbers += zonfuzz::sReachedChecks[i] ? "" : " " + std::to_string(i);
+	return numbers;
+}
+
 }   // namespace
 
 int main(int inCount, char** inArguments)
@@ -36,7 +48,11 @@ int main(int inCount, char** inArguments)
 			++files;
 		}
 	}
+	const std::string unreached = UnreachedChecks();
 	LLVMFuzzerTestOneInput(nullptr, 0);
 	std::printf("%d inputs\n", files);
-	return files > 0 ? 0 : 1;
+	if (!unreached.empty())
+		std::fprintf(stderr, "no input reaches these of the %zu checks, counted from 0:%s\n",
+			zonfuzz::sReachedChecks.size(), unreached.c_str());
+	return files > 0 && unreached.empty() ? 0 : 1;
 }
