@@ -157,7 +157,7 @@ TEST(Translations, ReachTheCompanion)
 {
 	for (const auto& [language, text] :
 		std::initializer_list<std::pair<std::string, const char*>>{{"de", "24-fps-Timecode"},
-			{"de_AT.UTF-8", "24-fps-Timecode"}, {"pt-BR", "Timecode de 24 fps"}, {"zh_CN", "24 fps 时间码"},
+			{"DE_at.UTF-8", "24-fps-Timecode"}, {"pt-BR", "Timecode de 24 fps"}, {"zh_CN", "24 fps 时间码"},
 			{CataloguePath("ja"), "24 fps タイムコード"}, {"en", "24 fps Timecode"}, {"en_GB", "24 fps Timecode"}})
 	{
 		const Outcome outcome = DisplaysIn(language);

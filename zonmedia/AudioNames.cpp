@@ -38,16 +38,31 @@ std::span<const Named<AudioChannelLabel>> LabelNames()
 	return sNames;
 }
 
-AudioChannelLayout ReadAbbreviations(std::string_view inText)
+AudioChannelLayout ReadAbbreviations(std::span<const std::string_view> inItems)
 {
 	AudioChannelLayout layout;
-	for (std::size_t begin = 0; begin < inText.size();)   // a comma may end the list, as in the library's own
-	{
-		const std::size_t end = std::min(inText.find(',', begin), inText.size());
-		layout.emplace_back(ValueNamed<AudioChannelLabel>(LabelNames(), "channel", inText.substr(begin, end - begin)));
-		begin = end + 1;
-	}
+	for (const std::string_view item : inItems)
+		layout.emplace_back(ValueNamed<AudioChannelLabel>(
+			LabelNames(), "channel", item, "; \"zonmedia audio layouts\" lists the channels of each layout"));
 	return layout;
+}
+
+std::vector<std::string_view> WordsOf(std::string_view inText)
+{
+	std::vector<std::string_view> words;
+	for (std::size_t begin = inText.find_first_not_of(' '); begin != std::string_view::npos;)
+	{
+		const std::size_t end = std::min(inText.find(' ', begin), inText.size());
+		words.push_back(inText.substr(begin, end - begin));
+		begin = inText.find_first_not_of(' ', end);
+	}
+	return words;
+}
+
+bool IsAbbreviation(std::string_view inText)
+{
+	return std::ranges::any_of(
+		LabelNames(), [inText](const auto& inNamed) { return IsSameName(inNamed.mName, inText); });
 }
 
 }   // namespace
@@ -60,10 +75,13 @@ std::span<const Named<AudioChannelLayout>> LayoutNames()
 
 AudioChannelLayout ReadLayout(std::string_view inText)
 {
-	const auto isMeant
-		= [inText](const Named<AudioChannelLabel>& inNamed) { return IsSameName(inNamed.mName, inText); };
-	if (std::ranges::any_of(LabelNames(), isMeant) || inText.find(',') != std::string_view::npos)
-		return ReadAbbreviations(inText);
+	if (inText.find(',') != std::string_view::npos)
+		return ReadAbbreviations(ItemsOf(inText, ','));
+	// Marks within words belong to names of layouts: "L_ R_C" is L R C, not L Rc.
+	const std::vector<std::string_view> words = WordsOf(inText);
+	if (inText.find_first_of("_-") == std::string_view::npos && !words.empty()
+		&& std::ranges::all_of(words, IsAbbreviation))
+		return ReadAbbreviations(words);
 	return ValueNamed<AudioChannelLayout>(LayoutNames(), "layout", inText,
 		"; abbreviations (L,R,LFE) also serve, and \"zonmedia audio layouts\" lists the channels of each");
 }

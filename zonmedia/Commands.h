@@ -8,9 +8,11 @@
 #include "zonmedia/Report.h"
 
 #include <CLI/CLI.hpp>
+#include <charconv>
 #include <functional>
 #include <memory>
 #include <string>
+#include <system_error>
 
 namespace zonmedia
 {
@@ -25,6 +27,21 @@ struct CommonArguments
 
 	Style GetStyle() const { return StyleOfOutput(mIsJson); }
 };
+
+/// Takes decimal numbers for which inIsFine holds; refuses everything else as no inWhat and says what was expected.
+template <class Number>
+CLI::Validator NumberWhere(bool (*inIsFine)(Number), const std::string& inWhat, const std::string& inExpected)
+{
+	const auto problem = [=](const std::string& inText)
+	{
+		Number number{};
+		const char* const end = inText.data() + inText.size();
+		const auto [behind, error] = std::from_chars(inText.data(), end, number);
+		const bool isFine = error == std::errc() && behind == end && inIsFine(number);
+		return isFine ? std::string() : Quoted(inText) + " is no " + inWhat + "; expected " + inExpected;
+	};
+	return {problem, inExpected};
+}
 
 /// Adds a command: inExamples are whole command lines, one each. Arguments derives from CommonArguments.
 template <class Arguments>

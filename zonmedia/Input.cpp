@@ -44,7 +44,7 @@ void ForEachValue(
 	const std::string& inValue, RecordList& ioRecords, const std::function<void(const std::string& inValue)>& inUse)
 {
 	if (inValue != "-")
-		return Use(inValue, "", ioRecords, inUse);
+		return Use(WithoutBlanks(inValue), "", ioRecords, inUse);
 	// Results on the same terminal show the progress themselves.
 	const bool showsProgress = isatty(STDERR_FILENO) == 1 && isatty(STDOUT_FILENO) == 0;
 	std::uint64_t number = 0;

@@ -69,10 +69,9 @@ fs::path FindCatalogue(std::string_view inLanguage)
 	const std::vector<std::string> present = LanguagesIn(folder);
 	for (const std::string& language : LanguagesOf(inLanguage))
 	{
-		if (language == kEnglish)
-			return {};
-		if (std::ranges::find(present, language) != present.end())
-			return CatalogueOf(folder, language);
+		const auto isMeant = [&](const std::string& inName) { return IsSameName(inName, language); };
+		if (const auto found = std::ranges::find_if(present, isMeant); found != present.end())
+			return *found == kEnglish ? fs::path() : CatalogueOf(folder, *found);
 	}
 	throw InputProblem(
 		UnknownName("language", inLanguage, {present.begin(), present.end()}) + " (in " + folder.string() + ")");

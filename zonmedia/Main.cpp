@@ -23,9 +23,13 @@ constexpr const char* kFooter = R"(Exit status:
      in English when it is the language that is missing or damaged
   2  the arguments make no command)";
 
+const std::string kValuesBehind = "--";
+
 // A value such as "-:30" begins as an option does; behind "--" everything is a value.
 std::vector<std::string> ValuesLast(std::vector<std::string> inArguments)
 {
+	if (std::ranges::find(inArguments, kValuesBehind) != inArguments.end())
+		return inArguments;
 	const auto isOption = [](std::string_view inArgument)
 	{
 		constexpr std::string_view kSeparators = ".:;";
@@ -34,23 +38,72 @@ std::vector<std::string> ValuesLast(std::vector<std::string> inArguments)
 	};
 	const auto values = std::stable_partition(inArguments.begin(), inArguments.end(), isOption);
 	if (values != inArguments.end())
-		inArguments.insert(values, "--");
+		inArguments.insert(values, kValuesBehind);
 	return inArguments;
 }
 
-// The command line in the words of whoever typed it: a command that does not exist, or what the parser says.
-std::string Explanation(const CLI::App& inApplication, const CLI::ParseError& inError)
+std::vector<std::string> CommandsOf(const CLI::App& inLevel)
 {
-	const std::vector<std::string> extras = inApplication.remaining(true);
+	std::vector<std::string> names;
+	for (const CLI::App* command : inLevel.get_subcommands({}))
+		names.push_back(command->get_name());
+	return names;
+}
+
+// The options that may stand behind a command: its own, and those of the whole program.
+std::vector<std::string> OptionsOf(const CLI::App& inLevel)
+{
+	std::vector<std::string> names;
+	for (const CLI::App* level = &inLevel; level != nullptr; level = level->get_parent())
+	{
+		for (const CLI::Option* option : level->get_options())
+		{
+			for (const std::string& name : option->get_lnames())
+			{
+				if (std::ranges::find(names, "--" + name) == names.end())
+					names.push_back("--" + name);
+			}
+		}
+	}
+	return names;
+}
+
+// What is wrong with the first of the arguments that the parser had no use for.
+std::string Unexpected(const std::string& inExtra, const CLI::App& inLevel, bool inIsBehindMark)
+{
+	const std::vector<std::string> commands = CommandsOf(inLevel);
+	if (!inExtra.starts_with('-'))
+		return commands.empty() ? Quoted(inExtra) + " is one argument too many"
+								: UnknownName("command", inExtra, {commands.begin(), commands.end()});
+	const std::vector<std::string> options = OptionsOf(inLevel);
+	const std::string name = inExtra.substr(0, inExtra.find('='));
+	if (std::ranges::find(options, name) == options.end())
+		return UnknownName("option", name, {options.begin(), options.end()});
+	return name
+		+ (inIsBehindMark ? " stands behind \"--\", where everything is a value" : " stands behind the command");
+}
+
+// The command line in the words of whoever typed it: what makes no command, or what the parser says.
+std::string Explanation(
+	const CLI::App& inApplication, const CLI::ParseError& inError, const std::vector<std::string>& inArguments)
+{
 	const CLI::App* level = &inApplication;
 	while (!level->get_subcommands().empty())
 		level = level->get_subcommands().front();
-	std::vector<std::string_view> commands;
-	for (const CLI::App* command : level->get_subcommands({}))
-		commands.emplace_back(command->get_name());
-	if (extras.empty() || extras.front().starts_with('-') || commands.empty())
-		return std::string(inError.what()) + " (see --help)";
-	return UnknownName("command", extras.front(), commands) + " (see --help)";
+	const std::vector<std::string> extras = inApplication.remaining(true);
+	const auto extra = std::ranges::find_if(extras, [](const auto& inExtra) { return inExtra != kValuesBehind; });
+	if (extra != extras.end())
+	{
+		const auto mark = std::ranges::find(inArguments, kValuesBehind);
+		return Unexpected(*extra, *level, std::find(mark, inArguments.end(), *extra) != inArguments.end());
+	}
+	if (const std::vector<std::string> commands = CommandsOf(*level); !commands.empty())
+		return "a command is required: " + Joined(std::vector<std::string_view>(commands.begin(), commands.end()));
+	const std::string said = inError.what();
+	const std::size_t colon = std::min(said.find(": "), said.size());   // behind the option that is wrong
+	if (dynamic_cast<const CLI::ArgumentMismatch*>(&inError) != nullptr)
+		return said.substr(0, colon) + (said.ends_with("missing") ? " needs a value" : " is given more than once");
+	return dynamic_cast<const CLI::ValidationError*>(&inError) != nullptr ? std::string(said).erase(colon, 1) : said;
 }
 
 // Fine, or a complaint: the command runs all the same, in English.
@@ -69,7 +122,7 @@ Status ChooseLanguage(const std::string& inLanguage)
 	}
 }
 
-Status RunCommandLine(std::vector<std::string> inArguments)
+Status RunCommandLine(const std::vector<std::string>& inArguments)
 {
 	Run run;
 	std::string language;
@@ -78,6 +131,7 @@ Status RunCommandLine(std::vector<std::string> inArguments)
 	application.set_version_flag("--version", zonmediatypes::Version());
 	application.add_option("--language", language,
 		"Describe values in a language, such as de or pt_BR, or from a message catalogue, such as ./de.mo");
+	application.ignore_case();
 	application.fallthrough();   // --language may stand behind the command, too
 	application.require_subcommand(1);
 	AddSheetCommand(application, run);
@@ -90,8 +144,8 @@ Status RunCommandLine(std::vector<std::string> inArguments)
 	AddKeysCommand(application, run);
 	try
 	{
-		std::ranges::reverse(inArguments);   // as the parser wants them
-		application.parse(inArguments);
+		application.parse(
+			std::vector<std::string>(inArguments.rbegin(), inArguments.rend()));   // as the parser wants them
 	}
 	catch (const CLI::Success& wish)   // --help and --version
 	{
@@ -100,17 +154,17 @@ Status RunCommandLine(std::vector<std::string> inArguments)
 	}
 	catch (const CLI::ParseError& error)
 	{
-		throw UsageProblem(Explanation(application, error));
+		throw UsageProblem(Explanation(application, error, inArguments) + " (see --help)");
 	}
 	const Status status = ChooseLanguage(language);
 	return std::max(status, run());
 }
 
-Status RunAndComplain(std::vector<std::string> inArguments)
+Status RunAndComplain(const std::vector<std::string>& inArguments)
 {
 	try
 	{
-		return RunCommandLine(std::move(inArguments));
+		return RunCommandLine(inArguments);
 	}
 	catch (const UsageProblem& problem)
 	{

@@ -92,13 +92,38 @@ std::string UnknownName(std::string_view inWhat, std::string_view inText, std::v
 		byDistance.emplace_back(Distance{!isWithin, EditDistance(name, inText)}, name);
 	}
 	std::ranges::stable_sort(byDistance, {}, &std::pair<Distance, std::string_view>::first);
-	const bool isAnyClose = byDistance.empty() || byDistance.front().first < Distance{true, Folded(inText).size()};
-	const bool showsAll = !isAnyClose && byDistance.size() <= kMostOfShortList;
 	std::string sentence = "no " + std::string(inWhat) + " is named " + Quoted(inText);
-	sentence.append(showsAll ? "; there are" : "; the closest are");
-	for (std::size_t i = 0; i < (showsAll ? byDistance.size() : std::min(kSuggestions, byDistance.size())); ++i)
-		sentence.append(i == 0 ? " " : ", ").append(byDistance[i].second);
-	return sentence;
+	if (!byDistance.empty() && byDistance.front().first < Distance{true, Folded(inText).size()})
+	{
+		std::ranges::transform(byDistance, inNames.begin(), &std::pair<Distance, std::string_view>::second);
+		inNames.resize(std::min(kSuggestions, inNames.size()));
+		return sentence + "; the closest are " + Joined(inNames);
+	}
+	return inNames.size() <= kMostOfShortList ? sentence + "; there are " + Joined(inNames) : sentence;
+}
+
+std::string Joined(std::span<const std::string_view> inNames)
+{
+	std::string text;
+	for (const std::string_view name : inNames)
+		text.append(text.empty() ? "" : ", ").append(name);
+	return text;
+}
+
+std::vector<std::string_view> ItemsOf(std::string_view inText, char inMark)
+{
+	std::vector<std::string_view> items;
+	for (std::size_t begin = 0; begin <= inText.size();)
+	{
+		const std::size_t end = std::min(inText.find(inMark, begin), inText.size());
+		items.push_back(inText.substr(begin, end - begin));
+		begin = end + 1;
+	}
+	if (items.size() > 1 && items.back().empty())
+		items.pop_back();
+	if (std::ranges::any_of(items, [](std::string_view inItem) { return IsSameName(inItem, ""); }))
+		throw UsageProblem("a name is missing in " + Quoted(inText));
+	return items;
 }
 
 }   // namespace zonmedia

@@ -31,9 +31,16 @@ std::size_t EditDistance(std::string_view inLHS, std::string_view inRHS);
 /// Whether two names are one: but for case, "_", "-" and blanks. Compares without writing either anew.
 bool IsSameName(std::string_view inLHS, std::string_view inRHS);
 
-/// A sentence that refuses inText: what it is no name of, and the closest of inNames, those first that hold it; all of a
-/// short list in which nothing is close.
+/// A sentence that refuses inText: what it is no name of, and the closest of inNames, those first that hold it. Where
+/// nothing is close, all of a short list as it stands, and none of a long one.
 std::string UnknownName(std::string_view inWhat, std::string_view inText, std::vector<std::string_view> inNames);
+
+/// The names with commas between them.
+std::string Joined(std::span<const std::string_view> inNames);
+
+/// The items of inText, which has inMark between them and may have one behind the last. Throws UsageProblem when one is
+/// empty.
+std::vector<std::string_view> ItemsOf(std::string_view inText, char inMark);
 
 /// The value that inText names: exactly, or else but for case and "_". Throws UsageProblem with the closest names.
 /// inWhat is what is named: "display"; inElse ends the sentence with what else would serve.

@@ -76,7 +76,8 @@ void AddPulldownCommand(CLI::App& ioApplication, Run& outRun)
 		->required();
 	command.add_option("--rate", arguments->mRate, "Rate of the video")->capture_default_str();
 	command.add_option("--groups", arguments->mGroups, "Groups of four film frames to show")
-		->check(CLI::Range(1, 1000))
+		->check(NumberWhere<int>([](int inGroups) { return inGroups >= 1 && inGroups <= 1000; }, "count of groups",
+			"a whole number from 1 to 1000"))
 		->capture_default_str();
 }
 

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cmath>
 #include <limits>
 #include <optional>
 #include <tuple>
@@ -93,22 +94,39 @@ std::uint64_t MostReadable(TimecodeFormat inFormat)
 	return inFormat == kTimecodeFormat_Samples ? kMostSamples : kMostOfField;
 }
 
+// What is in a text that is neither a digit nor a mark between numbers; empty when there is nothing.
+std::string_view ForeignCharacter(std::string_view inText)
+{
+	const std::size_t first = std::min(inText.find_first_not_of("0123456789:;., +-"), inText.size());
+	const auto isTail = [](char inByte) { return (static_cast<unsigned char>(inByte) & 0xC0) == 0x80; };   // of UTF-8
+	std::size_t end = first + 1;
+	while (end < inText.size() && isTail(inText[end]))
+		++end;
+	return inText.substr(first, end - first);
+}
+
+// Why the library would read less, or something else, than what was typed; empty when it would not.
+std::string Misreading(std::string_view inText, TimecodeFormat inFormat)
+{
+	if (inText.find_first_of("0123456789") == std::string_view::npos)
+		return "no digits in it";
+	if (const std::string_view foreign = ForeignCharacter(inText); !foreign.empty())
+		return Quoted(foreign) + " in it is neither a digit nor a separator";
+	return HasNumberAbove(inText, MostReadable(inFormat)) ? "too large a number in it" : "";
+}
+
 std::int64_t ReadSamples(const std::string& inText, TimecodeFormat inFormat, const Clock& inClock)
 {
-	const auto isDigit = [](char inChar) { return inChar >= '0' && inChar <= '9'; };
-	const bool isTooLarge = HasNumberAbove(inText, MostReadable(inFormat));
-	std::int64_t samples = 0;
-	BeatInfo beats = inClock.mBeats;
-	const bool isRead = !isTooLarge && std::ranges::any_of(inText, isDigit)
-		&& ConvertTimecodeToSamples(samples, UTF8to16(inText), inFormat, inClock.mSampleRate, inClock.mFramesPerSecond,
-			&beats, inClock.mIsDuration);
-	if (!isRead)
+	if (const std::string why = Misreading(inText, inFormat); !why.empty())
 	{
-		// An hour, a minute, a second and a bit: every field of every format has something to show.
-		const std::int64_t example = std::int64_t{inClock.mSampleRate} * 3661 + inClock.mSampleRate / 2;
-		const std::string why = isTooLarge ? "too large a number in it" : "no digits in it";
+		// A minute, a second and a bit; from 100 s on milliseconds lose digits.
+		const std::int64_t example = std::int64_t{inClock.mSampleRate} * 61 + inClock.mSampleRate / 2;
 		throw InputProblem(why + "; expected something like " + Quoted(SamplesText(example, inFormat, inClock)));
 	}
+	std::int64_t samples = 0;
+	BeatInfo beats = inClock.mBeats;
+	ConvertTimecodeToSamples(samples, UTF8to16(inText), inFormat, inClock.mSampleRate, inClock.mFramesPerSecond, &beats,
+		inClock.mIsDuration);   // false only without a BeatInfo
 	return samples;
 }
 
@@ -134,8 +152,8 @@ std::pair<std::int32_t, std::int32_t> ReadMeter(const std::string& inText)
 	const bool hasSlash = first.ec == std::errc() && first.ptr != end && *first.ptr == '/';
 	const auto second = hasSlash ? std::from_chars(first.ptr + 1, end, value) : first;
 	if (!hasSlash || second.ec != std::errc() || second.ptr != end || beats <= 0 || value <= 0)
-		throw UsageProblem("the meter " + Quoted(inText)
-			+ " is no meter; expected beats a bar and the note of a beat, such as 4/4 or 6/8");
+		throw UsageProblem(
+			Quoted(inText) + " is no meter; expected beats a bar and the note of a beat, such as 4/4 or 6/8");
 	return {beats, value};
 }
 
@@ -144,10 +162,6 @@ Clock ReadClock(const SamplesArguments& inArguments)
 	Clock clock{
 		ReadSampleRate(inArguments.mRate), inArguments.mFramesPerSecond, inArguments.mBeats, inArguments.mIsDuration};
 	std::tie(clock.mBeats.iBeatsPerBar, clock.mBeats.iBeatValue) = ReadMeter(inArguments.mMeter);
-	const std::int32_t ticks = clock.mBeats.iTicksPerBeat;
-	if (ticks < -1 || ticks == 0)
-		throw UsageProblem("--ticks " + std::to_string(ticks)
-			+ " is no count of ticks; expected 1 or more a beat, or -1 for decimal beats");
 	return clock;
 }
 
@@ -212,16 +226,22 @@ void AddSamplesCommand(CLI::App& ioApplication, Run& outRun)
 		->required();
 	command.add_option("--to", arguments->mTo, "How it is to be written; default: in every format");
 	command.add_option("--fps", arguments->mFramesPerSecond, "Frames a second, nominal: 30 for 29.97")
-		->check(CLI::Range(1, 100'000))
+		->check(NumberWhere<std::int32_t>([](std::int32_t inRate) { return inRate >= 1 && inRate <= 100'000; },
+			"nominal frame rate", "a whole number from 1 to 100000"))
 		->capture_default_str();
 	command.add_option("--tempo", arguments->mBeats.dTempo, "Quarter notes a minute")
-		->check(CLI::Range(0.001, 100'000.0))
+		->check(NumberWhere<double>([](double inTempo) { return inTempo >= 0.001 && inTempo <= 100'000.0; }, "tempo",
+			"0.001 to 100000 quarter notes a minute"))
 		->capture_default_str();
 	command.add_option("--meter", arguments->mMeter, "Beats a bar / note of a beat")->capture_default_str();
 	command.add_option("--ticks", arguments->mBeats.iTicksPerBeat, "Ticks a beat; -1 for decimal beats")
+		->check(NumberWhere<std::int32_t>([](std::int32_t inTicks) { return inTicks >= 1 || inTicks == -1; },
+			"count of ticks", "a whole number from 1, or -1 for decimal beats"))
 		->capture_default_str();
 	command
 		.add_option("--offset", arguments->mBeats.dOffsetMilliseconds, "Where the first bar begins, in milliseconds")
+		->check(NumberWhere<double>(
+			[](double inOffset) { return std::isfinite(inOffset); }, "offset", "a number of milliseconds, such as 500"))
 		->capture_default_str();
 	command.add_flag("--duration", arguments->mIsDuration, "The value is a length: bars and beats count from 0");
 }

@@ -45,6 +45,8 @@ Rate RateFor(const std::string& inText, TimeForm inForm)
 	const FrameRate own
 		= inForm.mDisplay ? GetFrameRateForTimeDisplay(*inForm.mDisplay, kFrameRate_Zero) : kFrameRate_Zero;
 	const auto rate = own.IsUsable() ? MakeRate({kTicksPerSecond, own.GetTicksPerFrame()}) : std::nullopt;
+	if (!rate && inForm.mDisplay == kTimeDisplay_Auto)
+		throw UsageProblem("--rate is required, or a --display with a rate of its own, such as 25 or 29.97df");
 	if (!rate)
 		throw UsageProblem("the display " + NameOf(inForm) + " has no rate of its own: --rate is required");
 	return *rate;
@@ -54,8 +56,10 @@ Conversion ReadConversion(const TimeArguments& inArguments)
 {
 	const TimeForm from = ReadTimeForm(inArguments.mDisplay);
 	const Rate rate = RateFor(inArguments.mRate, from);
-	const auto to = inArguments.mTo.empty() ? std::nullopt : std::optional(ReadTimeForm(inArguments.mTo));
-	return {rate, from, to, inArguments.mToRate.empty() ? rate : ReadRate(inArguments.mToRate)};
+	const Rate toRate = inArguments.mToRate.empty() ? rate : ReadRate(inArguments.mToRate);
+	const auto to = inArguments.mTo.empty() ? std::nullopt
+											: std::optional(ChosenForm(ReadTimeForm(inArguments.mTo), toRate.mRate));
+	return {rate, ChosenForm(from, rate.mRate), to, toRate};
 }
 
 Record MakeRecord(const std::string& inText, TickTime inTime, const Conversion& inConversion)

@@ -112,18 +112,38 @@ std::string Expectation(FrameRate inRate, TimeForm inForm)
 	const std::string description = DescriptionOf(inForm);
 	TickTime example = TickTime(kTicksPerSecond) * kExampleSeconds;
 	example.AddFrames(4, inRate);
-	return "not a time; expected " + (description.empty() ? "timecode" : description) + " such as "
-		+ TimeText(example, inRate, inForm);
+	return "not a time; expected something such as " + TimeText(example, inRate, inForm)
+		+ (description.empty() ? "" : " (" + description + ")");
 }
 
-// The library reads a larger number as 32 bits hold, and the time of more frames than ticks can count wraps.
+bool IsFilm(TimeForm inForm)
+{
+	return inForm.mDisplay == kTimeDisplay_16mmFeetFrames || inForm.mDisplay == kTimeDisplay_35mmFeetFrames;
+}
+
+// A sign, which may be missing, and one number or two with a separator between them: the library reads the rest as 0.
+bool IsFeetAndFrames(std::string_view inText)
+{
+	const auto isNumber = [](std::string_view inNumber)
+	{ return !inNumber.empty() && inNumber.find_first_not_of("0123456789") == std::string_view::npos; };
+	inText.remove_prefix(inText.starts_with('+') || inText.starts_with('-') ? 1 : 0);
+	const std::size_t separator = inText.find_first_of("+.:;");
+	return isNumber(inText.substr(0, separator))
+		&& (separator == std::string_view::npos || isNumber(inText.substr(separator + 1)));
+}
+
+// The library reads a larger number as 32 bits hold; the time of more frames than ticks can count wraps, and so do the
+// frames of feet beyond 32 bits.
 std::uint64_t MostReadable(FrameRate inRate, TimeForm inForm)
 {
 	constexpr std::uint64_t kMostOfGroup = std::numeric_limits<std::uint32_t>::max();
+	constexpr std::uint64_t kMostFilmFrames = std::numeric_limits<std::int32_t>::max();
+	constexpr std::uint64_t kMostFramesInFoot = 40;
 	constexpr std::int64_t kMostTicks = std::numeric_limits<std::int64_t>::max();
-	return inForm.mDisplay == kTimeDisplay_Frames
-		? std::min(kMostOfGroup, static_cast<std::uint64_t>(kMostTicks / inRate.GetTicksPerFrame()))
-		: kMostOfGroup;
+	const auto mostFrames = static_cast<std::uint64_t>(kMostTicks / inRate.GetTicksPerFrame());
+	if (IsFilm(inForm))
+		return std::min(kMostFilmFrames, mostFrames) / (kMostFramesInFoot + 1);   // of feet, and as many more frames
+	return inForm.mDisplay == kTimeDisplay_Frames ? std::min(kMostOfGroup, mostFrames) : kMostOfGroup;
 }
 
 }   // namespace
@@ -148,7 +168,9 @@ Rate ReadRate(std::string_view inText)
 	{
 		if (const std::optional<Rate> rate = MakeRate(*fraction))
 			return *rate;
-		throw UsageProblem("the rate " + Quoted(inText) + " cannot be used; expected more than 0 frames a second");
+		throw UsageProblem("the rate " + Quoted(inText) + " cannot be used; expected above 0 and up to "
+			+ std::to_string(kTicksPerSecond) + " frames a second, and at most "
+			+ std::to_string(std::numeric_limits<std::int64_t>::max() / kTicksPerSecond) + " seconds a frame");
 	}
 	const auto exact = std::ranges::find(sNames, inText, &Named<FrameRate>::mName);
 	if (exact != sNames.end())
@@ -181,6 +203,13 @@ std::string NameOf(TimeForm inForm)
 	return NameOf<TimeForm>(TimeForms(), inForm);
 }
 
+TimeForm ChosenForm(TimeForm inForm, FrameRate inRate)
+{
+	return inForm.mDisplay == kTimeDisplay_Auto
+		? TimeForm{GetTimeDisplayForFrameRate(inRate, true, false, kTimeDisplay_2997DropTimecode, false)}
+		: inForm;
+}
+
 std::string DescriptionOf(TimeForm inForm)
 {
 	return inForm.mDisplay ? UTF16to8(TimeDisplayDescription(*inForm.mDisplay)) : "Ticks";
@@ -198,16 +227,15 @@ TickTime ReadTime(std::string_view inText, FrameRate inRate, TimeForm inForm)
 {
 	if (const std::uint64_t most = MostReadable(inRate, inForm); inForm.mDisplay && HasNumberAbove(inText, most))
 		throw InputProblem("too large a number in it; expected " + std::to_string(most) + " at most");
-	if (inForm.mDisplay)
+	if (inForm.mDisplay && !inText.empty() && (!IsFilm(inForm) || IsFeetAndFrames(inText)))
 	{
 		const TickTime time = TimecodeToTime(UTF8to16(inText), inRate, *inForm.mDisplay);
 		if (time != kTime_Invalid)
 			return time;
 	}
-	else if (const auto ticks = WholeNumber(inText.starts_with('+') ? inText.substr(1) : inText))
-	{
+	const auto ticks = inForm.mDisplay ? std::nullopt : WholeNumber(inText.substr(inText.starts_with('+') ? 1 : 0));
+	if (ticks)
 		return TickTime(*ticks);
-	}
 	throw InputProblem(Expectation(inRate, inForm));
 }
 

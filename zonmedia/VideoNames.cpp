@@ -56,23 +56,20 @@ std::span<const Named<PixelFormat>> PixelFormatNames()
 
 PixelFormat ReadPixelFormat(std::string_view inText)
 {
-	if (inText == kAny)
+	if (IsSameName(inText, kAny))
 		return kPixelFormat_Any;
 	const auto hasCode = [inText](const Named<PixelFormat>& inNamed) { return CodeOf(inNamed.mValue) == inText; };
 	const auto named = std::ranges::find_if(PixelFormatNames(), hasCode);
 	return named != PixelFormatNames().end() ? named->mValue
-											 : ValueNamed<PixelFormat>(PixelFormatNames(), "pixel format", inText);
+											 : ValueNamed<PixelFormat>(PixelFormatNames(), "pixel format", inText,
+												 "; \"zonmedia video formats\" lists them");
 }
 
 PixelFormats ReadPixelFormats(std::string_view inText)
 {
 	PixelFormats formats;
-	for (std::size_t begin = 0; begin <= inText.size();)
-	{
-		const std::size_t end = std::min(inText.find(',', begin), inText.size());
-		formats.push_back(ReadPixelFormat(inText.substr(begin, end - begin)));
-		begin = end + 1;
-	}
+	for (const std::string_view name : ItemsOf(inText, ','))
+		formats.push_back(ReadPixelFormat(name));
 	return formats;
 }
 
@@ -98,18 +95,21 @@ RenderQuality ReadQuality(std::string_view inText)
 
 zoncore::PointT<int> ReadSize(std::string_view inText)
 {
+	constexpr int kMost = 100'000'000;   // at up to 16 bytes a pixel the bytes of a row are counted in 32 bits
+	const auto isIn = [](int inPixels) { return inPixels >= 1 && inPixels <= kMost; };
 	const auto size = ReadPair<int>(inText, 'x');
-	if (!size || size->first <= 0 || size->second <= 0)
-		throw UsageProblem(
-			Quoted(inText) + " is no frame size; expected width and height in pixels, such as 1920x1080");
+	if (!size || !isIn(size->first) || !isIn(size->second))
+		throw UsageProblem(Quoted(inText) + " is no frame size; expected width and height in pixels, 1 to "
+			+ std::to_string(kMost) + " each, such as 1920x1080");
 	return {size->first, size->second};
 }
 
 PixelAspectRatio ReadPixelAspectRatio(std::string_view inText)
 {
 	const auto ratio = ReadPair<unsigned>(inText, '/');
-	if (!ratio)
-		throw UsageProblem(Quoted(inText) + " is no pixel aspect ratio; expected a fraction such as 10/11");
+	if (!ratio || ratio->second == 0)
+		throw UsageProblem(
+			Quoted(inText) + " is no pixel aspect ratio; expected a fraction such as 10/11 with a denominator above 0");
 	return {ratio->first, ratio->second};
 }
 

@@ -31,10 +31,10 @@ std::string CodeOf(zonmediatypes::PixelFormat inFormat);
 /// Reads "draft", "low", "medium", "high" or "max". Throws UsageProblem.
 zonmediatypes::RenderQuality ReadQuality(std::string_view inText);
 
-/// Reads "1920x1080". Throws UsageProblem unless both are above 0.
+/// Reads "1920x1080". Throws UsageProblem unless both are above 0 and small enough for the bytes of any frame to be counted.
 zoncore::PointT<int> ReadSize(std::string_view inText);
 
-/// Reads "10/11". Throws UsageProblem.
+/// Reads "10/11". Throws UsageProblem, also for a denominator of 0.
 zonmediatypes::PixelAspectRatio ReadPixelAspectRatio(std::string_view inText);
 
 }   // namespace zonmedia
