@@ -13,6 +13,7 @@
 #include <cstdint>
 #include <functional>
 #include <gst/audio/audio.h>
+#include <utility>
 #include <vector>
 
 extern "C"
@@ -221,20 +222,89 @@ AudioChannelLayout LayoutOf(std::size_t inChannels)
 	return layout;
 }
 
-template <class Call>
-Work PerChannel(std::size_t inChannels, Call inCall)
+// Every number is a legal label: no search ends before its channel.
+AudioChannelLayout DistinctLayoutOf(std::size_t inChannels)
 {
-	return [inChannels, inCall](benchmark::State& ioState)
-	{
-		const AudioChannelLayout layout = LayoutOf(inChannels);
-		Call call = inCall;
-		for (auto _ : ioState)
-			benchmark::DoNotOptimize(call(layout));
-		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inChannels));
-	};
+	AudioChannelLayout layout;
+	for (std::size_t i = 0; i < inChannels; ++i)
+		layout.emplace_back(static_cast<AudioChannelLabel>(1'000 + i));
+	return layout;
 }
 
+// What the calls take and write. It stays on the heap from before the first call: without it, glibc gives large results back
+// to the system after each call, and most of the time are page faults in the next one.
+struct Grown
+{
+	explicit Grown(AudioChannelLayout inLayout) : mLayout(std::move(inLayout)) {}
+
+	AudioChannelLayout mLayout;
+	AudioChannelLayout mReversed{mLayout.rbegin(), mLayout.rend()};
+	AudioChannelLayout mUnlabelled = AudioChannelLayout(mLayout.size());
+	AudioChannelLayout mStereo = CreateStereoChannelLayout();
+	AudioChannelLabel mLastLabel = mLayout.back().mLabel;
+	std::int32_t mLastChannel = static_cast<std::int32_t>(mLayout.size()) - 1;
+	ChannelMap mMap = MapOf(mLayout);
+	ChannelMap mOtherMap = MapOf(mLayout);
+
+	AudioChannelLayout mResult;
+	ChannelConversionMatrix mMatrix;
+	ChannelOrdering mOrdering;
+};
+
 constexpr auto sChannelCounts = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000, 100'000});
+
+// An item is a channel.
+template <class Call>
+void GrowLayout(const char* inWhat, AudioChannelLayout (*inMakeLayout)(std::size_t), Call inCall)
+{
+	Grow(inWhat, sChannelCounts,
+		[inMakeLayout, inCall](std::size_t inChannels) -> Work
+		{
+			return [=](benchmark::State& ioState)
+			{
+				Grown grown(inMakeLayout(inChannels));
+				for (auto _ : ioState)
+					benchmark::DoNotOptimize(inCall(grown));
+				ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inChannels));
+			};
+		});
+}
+
+void AddGrowth()
+{
+	GrowLayout("matrix of so many channels to stereo", LayoutOf,
+		[](Grown& ioGrown)
+		{
+			ComputeChannelConversionMatrix(ioGrown.mLayout, ioGrown.mStereo, ioGrown.mMatrix);
+			return ioGrown.mMatrix.data();
+		});
+	GrowLayout("description of so many channels without a translation", LayoutOf,
+		[](Grown& ioGrown) { return AudioChannelLayoutDescriptionUnlocalized(ioGrown.mLayout); });
+	GrowLayout("description of so many different channels", DistinctLayoutOf,
+		[](Grown& ioGrown) { return AudioChannelLayoutDescription(ioGrown.mLayout); });
+	GrowLayout("ordering of so many different channels reversed", DistinctLayoutOf,
+		[](Grown& ioGrown) { return RemapChannelOrdering(ioGrown.mLayout, ioGrown.mReversed, ioGrown.mOrdering); });
+	GrowLayout("so many different labels for unlabelled channels", DistinctLayoutOf,
+		[](Grown& ioGrown) {
+			return ReplaceDiscreteLabelsWithDestinationLayoutLabels(
+				ioGrown.mUnlabelled, ioGrown.mLayout, ioGrown.mResult);
+		});
+	GrowLayout("whether so many different channels are the same in any order", DistinctLayoutOf,
+		[](Grown& ioGrown) { return ContainsSameChannelsIgnoreOrder(ioGrown.mLayout, ioGrown.mReversed); });
+	GrowLayout("channel map of so many different channels", DistinctLayoutOf,
+		[](Grown& ioGrown) { return ChannelMap(ioGrown.mLayout); });
+	GrowLayout("whether maps of so many different channels are equal", DistinctLayoutOf,
+		[](Grown& ioGrown) { return ioGrown.mMap == ioGrown.mOtherMap; });
+	GrowLayout("channel of the last label in a map of so many", DistinctLayoutOf,
+		[](Grown& ioGrown) { return ioGrown.mMap.GetSourceChannelIndexForChannelLabel(ioGrown.mLastLabel); });
+	GrowLayout("last label of a map of so many to the channel before and back", DistinctLayoutOf,
+		[](Grown& ioGrown)
+		{
+			ioGrown.mMap.SetDeviceChannelIndexForChannelLabel(ioGrown.mLastLabel, ioGrown.mLastChannel - 1);
+			ioGrown.mMap.SetDeviceChannelIndexForChannelLabel(ioGrown.mLastLabel, ioGrown.mLastChannel);
+			return ioGrown.mMap.GetNumberOfChannels();
+		});
+}
 
 [[maybe_unused]] const bool sAdded = []
 {
@@ -294,33 +364,7 @@ constexpr auto sChannelCounts = std::to_array<std::size_t>({1, 10, 100, 1'000, 1
 	Compare(kArea, "description, C L R (no name there)", Description(Create_C_L_R_ChannelLayout),
 		{{"libavutil", PeerDescriptionOf<AV_CHAN_FRONT_CENTER, AV_CHAN_FRONT_LEFT, AV_CHAN_FRONT_RIGHT>()}});
 
-	Grow("matrix of so many channels to stereo", sChannelCounts,
-		[](std::size_t inChannels)
-		{
-			return PerChannel(inChannels,
-				[destination = CreateStereoChannelLayout(), matrix = ChannelConversionMatrix()](
-					const AudioChannelLayout& inLayout) mutable
-				{
-					ComputeChannelConversionMatrix(inLayout, destination, matrix);
-					return matrix.data();
-				});
-		});
-	Grow("ordering of so many channels reversed", sChannelCounts,
-		[](std::size_t inChannels)
-		{
-			return PerChannel(inChannels,
-				[ordering = ChannelOrdering()](const AudioChannelLayout& inLayout) mutable
-				{
-					RemapChannelOrdering(inLayout, AudioChannelLayout(inLayout.rbegin(), inLayout.rend()), ordering);
-					return ordering.data();
-				});
-		});
-	Grow("description of so many channels without a translation", sChannelCounts,
-		[](std::size_t inChannels)
-		{
-			return PerChannel(inChannels,
-				[](const AudioChannelLayout& inLayout) { return AudioChannelLayoutDescriptionUnlocalized(inLayout); });
-		});
+	AddGrowth();
 	return true;
 }();
 

@@ -8,10 +8,14 @@
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <ctime>
+#include <functional>
 #include <gst/video/video.h>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -157,24 +161,83 @@ Work PeerBetweenLists(std::size_t inCount)
 
 // ---- Growth ----------------------------------------------------------------------------------------------------------
 
-// There is no removal: sizes are measured in the order in which they grow.
 PixelFormatName CustomName(std::size_t inIndex)
 {
 	const auto letter = [&](std::size_t inPlace) { return static_cast<char>('a' + inIndex / inPlace % 26); };
 	return MakePixelFormatName('@', letter(26 * 26), letter(26), letter(1));
 }
 
-Work CustomLookup(std::size_t inRegistered)
+constexpr auto sRegistrySizes = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000});
+
+// Nanoseconds of one call among so many registered formats.
+struct RegistryTimes
 {
-	return [inRegistered](benchmark::State& ioState)
+	double mLookup = 0;
+	double mRegistration = 0;
+};
+
+void Register(PixelFormatName inName)
+{
+	RegisterCustomPixelFormatProperties(inName, kPixelFormat_BGRA_4444_8u.mProperties);
+}
+
+template <class Call>
+double Nanoseconds(const std::vector<PixelFormatName>& inNames, Call inCall)
+{
+	constexpr int kRounds = 200;
+	const std::clock_t start = std::clock();
+	for (int round = 0; round < kRounds; ++round)
+		for (const PixelFormatName name : inNames)
+			inCall(name);
+	const auto calls = static_cast<double>(kRounds * inNames.size());
+	return 1e9 * static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC / calls;
+}
+
+// There is no removal, and repetitions come in any order: so the registry is measured once, while it grows.
+std::map<std::size_t, RegistryTimes> MeasureRegistry()
+{
+	std::map<std::size_t, RegistryTimes> times;
+	std::size_t registered = 0;
+	for (const std::size_t size : sRegistrySizes)
 	{
-		static std::size_t sRegistered = 0;
-		for (; sRegistered < inRegistered; ++sRegistered)
-			RegisterCustomPixelFormatProperties(CustomName(sRegistered), kPixelFormat_BGRA_4444_8u.mProperties);
+		do
+			Register(CustomName(registered));
+		while (++registered < size);
 		std::vector<PixelFormatName> names;
 		for (std::size_t i = 0; i < 1'024; ++i)
-			names.push_back(CustomName(i * 61'803 % inRegistered));
-		ForEach([&] { return names; }, [](PixelFormatName inName) { return LookupPropertiesForName(inName); })(ioState);
+			names.push_back(CustomName(i * 61'803 % registered));
+		times[size].mLookup = Nanoseconds(
+			names, [](PixelFormatName inName) { benchmark::DoNotOptimize(LookupPropertiesForName(inName)); });
+		times[size].mRegistration = Nanoseconds(names, Register);
+	}
+	return times;
+}
+
+std::function<Work(std::size_t)> Registry(double RegistryTimes::*inTime)
+{
+	return [inTime](std::size_t inSize)
+	{
+		return [inTime, inSize](benchmark::State& ioState)
+		{
+			static const std::map<std::size_t, RegistryTimes> sTimes = MeasureRegistry();
+			for (auto _ : ioState)
+				benchmark::ClobberMemory();
+			ioState.counters["items_per_second"] = 1e9 / (sTimes.at(inSize).*inTime);
+		};
+	};
+}
+
+// One list without the target itself, which would end the search. An item is a format of the list.
+Work NearestOfList(std::size_t inCount)
+{
+	return [inCount](benchmark::State& ioState)
+	{
+		PixelFormats sources = Spread(OurFormats(), inCount);
+		const PixelFormat target = kPixelFormat_UYVY_422_8u;
+		std::ranges::replace(sources, target, kPixelFormat_V210_422_10u);
+		for (auto _ : ioState)
+			benchmark::DoNotOptimize(SelectNearestSourcePixelFormat(sources, target.mProperties, kRenderQuality_High));
+		ioState.SetItemsProcessed(ioState.iterations() * static_cast<std::int64_t>(inCount));
 	};
 }
 
@@ -218,8 +281,11 @@ Work CustomLookup(std::size_t inRegistered)
 
 	constexpr auto kListSizes = std::to_array<std::size_t>({1, 10, 100, 1'000});
 	Grow("nearest between two lists of so many formats, a pair", kListSizes, NearestBetweenLists);
-	constexpr auto kRegistrySizes = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000});
-	Grow("look-up of a custom format among so many (a look-up)", kRegistrySizes, CustomLookup);
+	constexpr auto kLongListSizes = std::to_array<std::size_t>({1, 10, 100, 1'000, 10'000, 100'000});
+	Grow("nearest source of so many formats, a format", kLongListSizes, NearestOfList);
+	Grow("look-up of a custom format among so many (a look-up)", sRegistrySizes, Registry(&RegistryTimes::mLookup));
+	Grow("registration of a custom format again among so many (a registration)", sRegistrySizes,
+		Registry(&RegistryTimes::mRegistration));
 	return true;
 }();
 
