@@ -23,7 +23,8 @@ inline std::string Word(std::size_t inValue, bool inHighestFirst = false)
 inline std::string MakeCatalogue(const Messages& inMessages, bool inHighestFirst = false)
 {
 	const std::size_t tableBytes = 8 * inMessages.size();
-	std::string bytes, texts;
+	std::string bytes;
+	std::string texts;
 	for (const std::size_t word : {std::size_t{0x950412DE}, std::size_t{0}, inMessages.size(), std::size_t{28},
 			 28 + tableBytes, std::size_t{0}, std::size_t{0}})
 		bytes += Word(word, inHighestFirst);

@@ -56,11 +56,12 @@ inline std::string HexText(std::uint64_t inNumber)
 	return "0x" + std::string(digits.data(), end);
 }
 
-/// What inWrite writes to a stream with default settings.
+/// What inWrite writes to a stream with default settings; half a text is none, so that it throws when memory runs out.
 template <class Write>
 std::string TextOf(const Write& inWrite)
 {
 	std::ostringstream stream;
+	stream.exceptions(std::ios_base::badbit);
 	stream.imbue(std::locale::classic());
 	inWrite(stream);
 	return stream.str();
