@@ -1,6 +1,7 @@
 // Decimal time, milliseconds and beats of the sample clock.
 
 #include "Checks.h"
+#include "Numbers.h"
 #include "SampleClockInput.h"
 
 #include <array>
@@ -12,6 +13,8 @@ namespace
 using namespace zonmediatypes::utility;
 using zoncore::UTF16String;
 using zonfuzz::FuzzInput;
+using zonfuzz::Numbers;
+using zonfuzz::ReadNumbers;
 using zonfuzz::Require;
 using zonfuzz::RequirePositionInBuffers;
 using zonfuzz::sBefore;
@@ -61,36 +64,59 @@ void CheckWriting(FuzzInput& ioInput)
 	RequirePositionInBuffers(text, samples, sampleRate, format, 30, given, isDuration);
 }
 
-// A position below ten hours is written with milliseconds, and read back within one of them.
+constexpr std::array<std::int32_t, 6> kSampleRates{48'000, 44'100, 22'050, 8'000, 96'000, 192'000};
+
+// A position below ten hours is written with the milliseconds of the sample's middle, and read back within one of them,
+// but for its sign.
 void CheckRoundTrip(FuzzInput& ioInput)
 {
-	constexpr std::int32_t kSampleRate = 48'000;
-	const std::int64_t samples = ioInput.Any<std::uint32_t>() % (36'000u * kSampleRate);
+	const std::int64_t any = ioInput.Any<std::uint32_t>();
+	const std::int32_t sampleRate = ioInput.OneOf(kSampleRates);
+	const bool isNegative = ioInput.Flag();
+	const std::int64_t samples = any % (36'000ll * sampleRate);
 	UTF16String text;
-	ConvertSamplesToTimecode(text, samples, kSampleRate, kTimecodeFormat_Decimal, 30, nullptr, false);
+	ConvertSamplesToTimecode(
+		text, isNegative ? -samples : samples, sampleRate, kTimecodeFormat_Decimal, 30, nullptr, false);
 	std::int64_t again = -1;
-	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Decimal, kSampleRate, 30, nullptr, false);
-	Require(std::abs(again - samples) <= kSampleRate / 1'000, "decimal time is exact to the millisecond");
+	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Decimal, sampleRate, 30, nullptr, false);
+	Require(std::abs(again - samples) <= sampleRate / 1'000, "decimal time is exact to the millisecond");
+
+	const std::int64_t milliseconds = (2 * samples + 1) * 500 / sampleRate, minutes = milliseconds / 60'000;
+	Numbers numbers{minutes, milliseconds / 1'000 % 60, milliseconds % 1'000};
+	if (minutes >= 60)
+		numbers = {minutes / 60, minutes % 60, numbers[1], numbers[2]};
+	Require(ReadNumbers(text) == numbers, "the text shows hours, minutes, seconds and milliseconds");
+	Require((text.find('-') != UTF16String::npos) == (isNegative && samples > 0), "and the sign");
 }
 
 // Quarter notes are written with three decimals, milliseconds with one or as six digits, and read back as exactly.
 void CheckCountsRoundTrip(FuzzInput& ioInput)
 {
-	constexpr std::int32_t kSampleRate = 48'000;
 	BeatInfo beats;
 	beats.dTempo = 30 + ioInput.Any<std::uint8_t>();
-	const std::int64_t samples = ioInput.Any<std::uint32_t>() % (36'000u * kSampleRate);
+	const std::int64_t any = ioInput.Any<std::uint32_t>();
+	const std::int32_t sampleRate = ioInput.OneOf(kSampleRates);
+	const std::int64_t samples = any % (36'000ll * sampleRate);
 	UTF16String text;
 	std::int64_t again = -1;
-	ConvertSamplesToTimecode(text, samples, kSampleRate, kTimecodeFormat_Beats, 30, &beats, false);
-	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Beats, kSampleRate, 30, &beats, false);
-	const double perBeat = kSampleRate * 60 / beats.dTempo;
+	ConvertSamplesToTimecode(text, samples, sampleRate, kTimecodeFormat_Beats, 30, &beats, false);
+	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Beats, sampleRate, 30, &beats, false);
+	const double perBeat = sampleRate * 60 / beats.dTempo;
 	Require(std::abs(static_cast<double>(again - samples)) <= perBeat / 1'000 + 1, "beats are exact to the thousandth");
+	const Numbers numbers = ReadNumbers(text);
+	Require(numbers.size() == 2
+			&& std::abs(static_cast<double>(numbers[0] * 1'000 + numbers[1])
+				   - static_cast<double>(samples) * 1'000 / perBeat)
+				<= 0.51,
+		"the text shows the nearest thousandth");
 
-	const std::int64_t few = samples % (99 * kSampleRate);   // with tenths; longer texts have fewer digits
-	ConvertSamplesToTimecode(text, few, kSampleRate, kTimecodeFormat_Milliseconds, 30, nullptr, false);
-	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Milliseconds, kSampleRate, 30, nullptr, false);
-	Require(std::abs(again - few) <= kSampleRate / 10'000 + 1, "milliseconds are exact to the tenth");
+	const std::int64_t few = samples % (99 * sampleRate);   // with tenths; longer texts have fewer digits
+	const bool isNegative = ioInput.Flag();
+	ConvertSamplesToTimecode(
+		text, isNegative ? -few : few, sampleRate, kTimecodeFormat_Milliseconds, 30, nullptr, false);
+	ConvertTimecodeToSamples(again, text, kTimecodeFormat_Milliseconds, sampleRate, 30, nullptr, false);
+	const int halves = isNegative ? 3 : 1;   // below zero half a tenth is added, too, before what is left is cut off
+	Require((std::abs(again - few) - 1) * 20'000 <= halves * sampleRate, "milliseconds are exact to the tenth");
 }
 
 // The functions for one format and the one for all agree, and durations are written as positions are.
