@@ -1,10 +1,13 @@
 // Templates and keys whose placeholders are filled, and text that is replaced, against a walk character by character.
 
 #include "BufferChecks.h"
+#include "SmallCatalogue.h"
 #include "zoncore/Localizer.h"
+#include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"
 
 #include <algorithm>
+#include <memory>
 #include <mutex>
 #include <span>
 #include <string>
@@ -102,11 +105,26 @@ void InstallTranslator()
 		});
 }
 
+// Installs the small catalogue, or takes it away.
+void InstallCatalogue(bool inIsWanted)
+{
+	static const auto sCatalogue = []
+	{
+		auto catalogue = std::make_shared<config::MessageCatalogue>();
+		std::string error;
+		Require(catalogue->Parse(zonfuzz::SmallCatalogue(), error), "a sound catalogue is read");
+		return catalogue;
+	}();
+	config::Localizer::Get().SetCatalogue(inIsWanted ? sCatalogue : nullptr);
+}
+
 void CheckKeys(FuzzInput& ioInput)
 {
 	static std::once_flag sIsInstalled;
 	std::call_once(sIsInstalled, InstallTranslator);
 	std::vector<UTF16String> texts = TakePieces(ioInput);
+	const bool hasCatalogue = texts.size() % 2 == 0;
+	InstallCatalogue(hasCatalogue);
 	sTranslation = texts.back();
 	texts.pop_back();
 	const config::Localizer& localizer = config::Localizer::Get();
@@ -117,9 +135,11 @@ void CheckKeys(FuzzInput& ioInput)
 	Require(localizer.Lookup(unknown, english) == utility::UTF8to16(english), "also when it is at hand");
 	for (const std::string& key : {known, unknown})
 		Require(localizer.Lookup(key, texts) == FillStepwise(localizer.Lookup(key), texts), "templates are filled");
+	Require(localizer.Lookup("$$$/a=b") == UTF16String{static_cast<UTF16Char>(hasCatalogue ? 'c' : 'b')},
+		"the catalogue knows what the translator does not");
 	const std::string anything = utility::UTF16to8(texts.empty() ? sTranslation : texts.front());
 	const std::size_t equals = anything.find('=');
-	Require(anything.starts_with("$$$/known/")
+	Require(anything.starts_with("$$$/known/") || anything == "$$$/a=b"
 			|| localizer.Lookup(anything)
 				== utility::UTF8to16(equals == std::string::npos ? "" : anything.substr(equals + 1)),
 		"the English text stands behind the first mark");
