@@ -2,6 +2,7 @@
 // that once mattered. It fails where an invariant does not hold, and where no input reaches one of the target's checks.
 
 #include "Checks.h"
+#include "tests/TestLocale.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -39,6 +40,8 @@ std::string UnreachedChecks()
 
 int main(int inCount, char** inArguments)
 {
+	if (!zontest::SetTestLocale())
+		return 1;
 	int files = 0;
 	for (int i = 1; i < inCount; ++i)
 	{

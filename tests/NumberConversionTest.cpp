@@ -9,11 +9,13 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <array>
 #include <bit>
 #include <cerrno>
 #include <climits>
 #include <cmath>
 #include <cstdint>
+#include <cstdio>
 #include <cstdlib>
 #include <iomanip>
 #include <limits>
@@ -277,6 +279,15 @@ TEST(RationalApproximation, IsCloserThanItsNeighbours)
 			ASSERT_LE(abs(cpp_rational(value) - cpp_rational(p, q)), abs(cpp_rational(value) - neighbour)) << value;
 		}
 	}
+}
+
+// The run of all tests under a locale that writes numbers otherwise would prove nothing without it.
+TEST(TestLocale, IsInForceWhereItIsAskedFor)
+{
+	const bool isAskedFor = std::getenv("ZON_TEST_LOCALE") != nullptr;
+	std::array<char, 8> text{};
+	std::snprintf(text.data(), text.size(), "%.1f", 1.5);
+	EXPECT_STREQ(text.data(), isAskedFor ? "1,5" : "1.5");
 }
 
 }   // namespace
