@@ -163,10 +163,10 @@ TEST(TimecodeToTime, ReadsWhatUsersType)
 		{kPAL, 101, kOmit | kTrim | kSign, {{90, "3:15"}}},
 		// Feet and frames: a second sign is the number's own, feet wrap at 32 bits
 		{kPAL, 112, 0,
-			{{200, "12+08"}, {200, "1208"}, {-200, "-1208"}, {200, " 12; 08x"}, {200, "\t12+08"}, {8, "+8"}, {0, "-"},
+			{{200, "12+08"}, {200, "1208"}, {-200, "-1208"}, {200, " 12; 08x"}, {200, "\t\r12+08"}, {8, "+8"}, {0, "-"},
 				{0, "x+y"}, {192, "12+"}, {-184, "+-1208"}, {184, "--12+8"}, {5 - 0x8000'0000ll, "134217728+5"},
-				{5, "268435456+5"}, {-16, "99999999999999999999+0"}, {16, "-99999999999999999999+0"},
-				{1, "+-99999999999999999999+1"}, {15, "1+99999999999999999999"}}},
+				{5, "268435456+5"}, {675'282'944, "9000000000000000000+0"}, {-16, "99999999999999999999+0"},
+				{16, "-99999999999999999999+0"}, {1, "+-99999999999999999999+1"}, {15, "1+99999999999999999999"}}},
 		{kPAL, 111, 0, {{488, "12:8"}}},
 		{kNTSC, 999, 0, {{1'800, "00:01:00;02"}}},
 	};
@@ -228,6 +228,7 @@ TEST(TimeToHMSF, GivesTheFieldsOfTheDisplay)
 		{Frames(100, kPAL), kBackwards, 109, {0, 0, 0, false, 0 - 100ull}},
 		{TickTime(kLeast), FrameRate(-1), 109, {0, 0, 0, true, 1ull << 63}},
 		{Frames(61, kSecond), kSecond, 200, {0, 1, 1, false, 0}},
+		{TickTime(-1), kSecond, 200, {0, 0, 0, false, 0}},
 		{TickTime(kLeast), FrameRate(1), 200, {6, 10, 1, true, 0x8000'0000'0000'0000 % kTicksPerSecond}},
 		// Without a rate only the sign
 		{TickTime(-5), kBackwards, 200, {0, 0, 0, true, 0}},
@@ -277,6 +278,8 @@ TEST(HMSFToTime, CarriesWhatIsTooLarge)
 		{{0, 0, 1, false, 3}, FrameRate(kTicksPerSecond), 200, 4},
 		{{0, 0, 1, false, 7}, kFrameRate_Zero, 200, 7},
 		{{0, 0, 1, false, 7}, FrameRate(-kPAL.GetTicksPerFrame()), 200, 0 - 25 + 7},
+		{{0, 0, 1, false, 31}, FrameRate(-kNTSC.GetTicksPerFrame()), 200, 2},
+		{{0, 0, 1, false, 31}, FrameRate(-kNTSC.GetTicksPerFrame()), 109, 1},
 		{{0, 0, 1, false, 7}, kPAL, 5, 7},
 	};
 	for (const auto& [fields, rate, display, frames] : cases)

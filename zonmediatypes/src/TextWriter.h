@@ -62,7 +62,7 @@ public:
 	{
 		if (inNumber >= 0 && inNumber < 100 && inWidth == 2)
 			return PutTwoDigits(static_cast<std::size_t>(inNumber));
-		char digits[kLongestInteger];
+		char digits[kLongestInteger]{};   // a compiler that does not see what to_chars writes warns otherwise
 		const char* const end = std::to_chars(digits, std::end(digits), inNumber).ptr;
 		const auto length = static_cast<std::size_t>(end - digits);
 		for (std::size_t i = length; i < inWidth; ++i)
