@@ -138,11 +138,11 @@ std::uint64_t MostReadable(FrameRate inRate, TimeForm inForm)
 {
 	constexpr std::uint64_t kMostOfGroup = std::numeric_limits<std::uint32_t>::max();
 	constexpr std::uint64_t kMostFilmFrames = std::numeric_limits<std::int32_t>::max();
-	constexpr std::uint64_t kMostFramesInFoot = 40;
+	const std::uint64_t framesInFoot = inForm.mDisplay == kTimeDisplay_16mmFeetFrames ? 40 : 16;
 	constexpr std::int64_t kMostTicks = std::numeric_limits<std::int64_t>::max();
 	const auto mostFrames = static_cast<std::uint64_t>(kMostTicks / inRate.GetTicksPerFrame());
 	if (IsFilm(inForm))
-		return std::min(kMostFilmFrames, mostFrames) / (kMostFramesInFoot + 1);   // of feet, and as many more frames
+		return std::min(kMostFilmFrames, mostFrames) / framesInFoot;
 	return inForm.mDisplay == kTimeDisplay_Frames ? std::min(kMostOfGroup, mostFrames) : kMostOfGroup;
 }
 
