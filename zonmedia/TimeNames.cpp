@@ -116,9 +116,12 @@ std::string Expectation(FrameRate inRate, TimeForm inForm)
 		+ (description.empty() ? "" : " (" + description + ")");
 }
 
-bool IsFilm(TimeForm inForm)
+// 0 for what is not shown in feet and frames.
+std::uint64_t FramesPerFoot(TimeForm inForm)
 {
-	return inForm.mDisplay == kTimeDisplay_16mmFeetFrames || inForm.mDisplay == kTimeDisplay_35mmFeetFrames;
+	if (inForm.mDisplay == kTimeDisplay_16mmFeetFrames)
+		return 40;
+	return inForm.mDisplay == kTimeDisplay_35mmFeetFrames ? 16 : 0;
 }
 
 // A sign, which may be missing, and one number or two with a separator between them: the library reads the rest as 0.
@@ -138,11 +141,10 @@ std::uint64_t MostReadable(FrameRate inRate, TimeForm inForm)
 {
 	constexpr std::uint64_t kMostOfGroup = std::numeric_limits<std::uint32_t>::max();
 	constexpr std::uint64_t kMostFilmFrames = std::numeric_limits<std::int32_t>::max();
-	const std::uint64_t framesInFoot = inForm.mDisplay == kTimeDisplay_16mmFeetFrames ? 40 : 16;
 	constexpr std::int64_t kMostTicks = std::numeric_limits<std::int64_t>::max();
 	const auto mostFrames = static_cast<std::uint64_t>(kMostTicks / inRate.GetTicksPerFrame());
-	if (IsFilm(inForm))
-		return std::min(kMostFilmFrames, mostFrames) / framesInFoot;
+	if (const std::uint64_t framesPerFoot = FramesPerFoot(inForm); framesPerFoot != 0)
+		return std::min(kMostFilmFrames, mostFrames) / framesPerFoot;
 	return inForm.mDisplay == kTimeDisplay_Frames ? std::min(kMostOfGroup, mostFrames) : kMostOfGroup;
 }
 
@@ -227,7 +229,7 @@ TickTime ReadTime(std::string_view inText, FrameRate inRate, TimeForm inForm)
 {
 	if (const std::uint64_t most = MostReadable(inRate, inForm); inForm.mDisplay && HasNumberAbove(inText, most))
 		throw InputProblem("too large a number in it; expected " + std::to_string(most) + " at most");
-	if (inForm.mDisplay && !inText.empty() && (!IsFilm(inForm) || IsFeetAndFrames(inText)))
+	if (inForm.mDisplay && !inText.empty() && (FramesPerFoot(inForm) == 0 || IsFeetAndFrames(inText)))
 	{
 		const TickTime time = TimecodeToTime(UTF8to16(inText), inRate, *inForm.mDisplay);
 		if (time != kTime_Invalid)
