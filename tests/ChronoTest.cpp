@@ -46,9 +46,11 @@ std::optional<std::int64_t> RoundedQuotient(const Wide& inDividend, const Wide& 
 TEST(TimeBase, RoundsExactlyOverTheWholeRange)
 {
 	std::mt19937_64 random(1);
-	const std::int64_t edges[] = {0, 1, -1, kMin, kMax, kMin + 1, kMin / 2, -(kMin / 2)};
-	const std::pair<std::int64_t, std::int64_t> ratios[] = {{1, 90'000}, {1'001, 30'000}, {1, 48'000}, {7, 3},
-		{1, kTicksPerSecond}, {1, 2 * kTicksPerSecond}, {1, kMax}, {36'000'000, 1}, {9'999'937, 1'000'003}};
+	const std::int64_t edges[] = {0, 1, -1, kMin, kMax, kMin + 1, kMin / 2, -(kMin / 2),
+		-3'074'457'345'618'258'603};   // a third of one below the least
+	const std::pair<std::int64_t, std::int64_t> ratios[]
+		= {{1, 90'000}, {1'001, 30'000}, {1, 48'000}, {7, 3}, {1, kTicksPerSecond}, {1, 2 * kTicksPerSecond},
+			{1, 3 * kTicksPerSecond}, {1, kMax}, {36'000'000, 1}, {9'999'937, 1'000'003}};
 	for (const auto& [numerator, denominator] : ratios)
 	{
 		const auto base = TimeBase::FromRatio(numerator, denominator);
@@ -56,7 +58,7 @@ TEST(TimeBase, RoundsExactlyOverTheWholeRange)
 		for (int i = 0; i < 8'000; ++i)
 		{
 			const auto rounding = static_cast<Rounding>(i % 4);
-			const auto value = i < 32 ? edges[i / 4] : static_cast<std::int64_t>(random()) >> random() % 64;
+			const auto value = i < 36 ? edges[i / 4] : static_cast<std::int64_t>(random()) >> random() % 64;
 			const Wide ticks = Wide(value) * kTicksPerSecond * numerator;
 			const auto time = base->ToTicks(value, rounding);
 			EXPECT_EQ(
