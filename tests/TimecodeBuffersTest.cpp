@@ -95,7 +95,7 @@ TEST_P(EveryDisplay, FillsColumnsWithTheFieldsOfOneTime)
 	const std::vector<TickTime> times = Times();
 	for (const FrameRate rate : Rates())
 	{
-		std::vector<TimecodeFields> column(times.size());
+		std::vector<TimecodeFields> column(times.size(), {1, 2, 3, true, 4});
 		ASSERT_EQ(TimesToHMSF(column, times, rate, GetParam()), times.size());
 		for (std::size_t i = 0; i < times.size(); ++i)
 		{
