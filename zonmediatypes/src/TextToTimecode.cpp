@@ -1,5 +1,6 @@
-#include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Timecode.h"
+
+#include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/src/Digits.h"
 #include "zonmediatypes/src/TimecodeFields.h"
 

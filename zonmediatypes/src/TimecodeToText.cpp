@@ -1,4 +1,5 @@
 #include "zonmediatypes/Timecode.h"
+
 #include "zonmediatypes/src/TextWriter.h"
 #include "zonmediatypes/src/TimecodeFields.h"
 
