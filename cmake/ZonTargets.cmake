@@ -27,10 +27,11 @@ function(zon_target_defaults inTarget)
 		VISIBILITY_INLINES_HIDDEN ON)
 endfunction()
 
-# A library of the project: its sources are all of its src/ folder, its headers are found from the repository root.
-# inMacro is the prefix of its export macro (see Export.h of the library).
+# A library of the project: its sources are all of its src/ folder and of the folders in it, an area each; its headers are
+# found from the repository root. inMacro is the prefix of its export macro (see Export.h of the library).
 function(zon_add_library inTarget inMacro)
-	file(GLOB sources CONFIGURE_DEPENDS "${CMAKE_CURRENT_SOURCE_DIR}/src/*.cpp")
+	file(GLOB sources CONFIGURE_DEPENDS
+		"${CMAKE_CURRENT_SOURCE_DIR}/src/*.cpp" "${CMAKE_CURRENT_SOURCE_DIR}/src/*/*.cpp")
 	add_library(${inTarget} ${sources})
 	add_library(${inTarget}::${inTarget} ALIAS ${inTarget})
 	zon_target_defaults(${inTarget})

@@ -2,7 +2,7 @@
 
 #include "Pictures.h"
 #include "Svg.h"
-#include "zonmediatypes/src/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLabels.h"
 
 #include <algorithm>
 #include <array>

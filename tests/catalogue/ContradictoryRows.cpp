@@ -1,8 +1,8 @@
 // Rows that must not compile, each for the reason above it: the test reads the reasons here, and looks for them among the
 // compiler's messages.
 
-#include "zonmediatypes/src/PerfectIndex.h"
-#include "zonmediatypes/src/PixelFormatFacts.h"
+#include "zonmediatypes/src/video/PerfectIndex.h"
+#include "zonmediatypes/src/video/PixelFormatFacts.h"
 
 #include <array>
 #include <cstdint>

@@ -7,7 +7,7 @@ if(NOT ZON_HAS_FMA_OPTION)
 endif()
 
 foreach(name ContractionOff ContractionOn)
-	add_executable(${name} contraction/ContractionCase.cpp "${zonmediatypes_SOURCE_DIR}/zonmediatypes/src/BarsAndBeats.cpp")
+	add_executable(${name} contraction/ContractionCase.cpp "${zonmediatypes_SOURCE_DIR}/zonmediatypes/src/sampleclock/BarsAndBeats.cpp")
 	zon_target_defaults(${name})
 	target_link_libraries(${name} PRIVATE zoncore::zoncore)
 	target_compile_definitions(${name} PRIVATE ZONMEDIATYPES_STATIC)   # its one source is linked in as it is

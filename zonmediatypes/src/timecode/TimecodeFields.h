@@ -6,8 +6,8 @@
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
-#include "zonmediatypes/src/DropFrame.h"
-#include "zonmediatypes/src/TimeDisplayTable.h"
+#include "zonmediatypes/src/time/DropFrame.h"
+#include "zonmediatypes/src/timecode/TimeDisplayTable.h"
 
 #include <cmath>
 #include <cstddef>

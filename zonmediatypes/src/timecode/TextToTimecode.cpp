@@ -2,7 +2,7 @@
 
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/src/Digits.h"
-#include "zonmediatypes/src/TimecodeFields.h"
+#include "zonmediatypes/src/timecode/TimecodeFields.h"
 
 #include <algorithm>
 #include <cstddef>

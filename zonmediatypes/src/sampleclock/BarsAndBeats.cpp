@@ -1,7 +1,7 @@
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/TimeConversionUtils.h"
-#include "zonmediatypes/src/SampleClock.h"
+#include "zonmediatypes/src/sampleclock/SampleClock.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "zonmediatypes/src/AudioChannelLabels.h"
-#include "zonmediatypes/src/TextKeys.h"
+#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/text/TextKeys.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,6 @@
 #include "zonmediatypes/Timecode.h"
 
-#include "zonmediatypes/src/TimecodeFields.h"
+#include "zonmediatypes/src/timecode/TimecodeFields.h"
 
 #include <algorithm>
 

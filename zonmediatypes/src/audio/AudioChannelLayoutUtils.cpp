@@ -1,7 +1,7 @@
 #include "zonmediatypes/AudioChannelLayout.h"
 
-#include "zonmediatypes/src/AudioChannelLabels.h"
-#include "zonmediatypes/src/AudioChannelLayouts.h"
+#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLayouts.h"
 
 #include <algorithm>
 #include <array>

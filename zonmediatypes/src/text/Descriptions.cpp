@@ -3,13 +3,13 @@
 #include "zoncore/Localizer.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
-#include "zonmediatypes/src/AudioChannelLabels.h"
-#include "zonmediatypes/src/AudioChannelLayouts.h"
-#include "zonmediatypes/src/AudioTextKeys.h"
-#include "zonmediatypes/src/RateText.h"
-#include "zonmediatypes/src/TextKeys.h"
-#include "zonmediatypes/src/TimeTextKeys.h"
-#include "zonmediatypes/src/VideoTextKeys.h"
+#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLayouts.h"
+#include "zonmediatypes/src/text/AudioTextKeys.h"
+#include "zonmediatypes/src/text/TextKeys.h"
+#include "zonmediatypes/src/text/TimeTextKeys.h"
+#include "zonmediatypes/src/text/VideoTextKeys.h"
+#include "zonmediatypes/src/time/RateText.h"
 
 #include <algorithm>
 #include <array>

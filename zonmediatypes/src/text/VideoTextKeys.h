@@ -4,7 +4,7 @@
 #include "zonmediatypes/PixelAspectRatio.h"
 #include "zonmediatypes/PixelFormatProperties.h"
 #include "zonmediatypes/PixelFormatSelection.h"
-#include "zonmediatypes/src/TextKeys.h"
+#include "zonmediatypes/src/text/TextKeys.h"
 
 #include <array>
 #include <string_view>

@@ -1,7 +1,7 @@
 #include "zonmediatypes/Timecode.h"
 
 #include "zonmediatypes/src/TextWriter.h"
-#include "zonmediatypes/src/TimecodeFields.h"
+#include "zonmediatypes/src/timecode/TimecodeFields.h"
 
 #include <algorithm>
 #include <cstddef>

@@ -1,6 +1,6 @@
 #include "zonmediatypes/TimeDisplayUtils.h"
 
-#include "zonmediatypes/src/TimeDisplayTable.h"
+#include "zonmediatypes/src/timecode/TimeDisplayTable.h"
 
 #include <algorithm>
 

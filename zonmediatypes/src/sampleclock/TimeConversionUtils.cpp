@@ -3,8 +3,8 @@
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/src/Digits.h"
-#include "zonmediatypes/src/DropFrame.h"
-#include "zonmediatypes/src/SampleClock.h"
+#include "zonmediatypes/src/sampleclock/SampleClock.h"
+#include "zonmediatypes/src/time/DropFrame.h"
 
 #include <algorithm>
 #include <array>

@@ -2,8 +2,8 @@
 
 #include "zoncore/SmallBlockAllocator.h"
 #include "zonmediatypes/PixelFormatUtils.h"
-#include "zonmediatypes/src/PerfectIndex.h"
-#include "zonmediatypes/src/PixelFormatFacts.h"
+#include "zonmediatypes/src/video/PerfectIndex.h"
+#include "zonmediatypes/src/video/PixelFormatFacts.h"
 
 #include <algorithm>
 #include <array>

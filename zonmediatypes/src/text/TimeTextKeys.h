@@ -1,7 +1,7 @@
 #pragma once
 
 #include "zonmediatypes/TimeDisplayUtils.h"
-#include "zonmediatypes/src/TextKeys.h"
+#include "zonmediatypes/src/text/TextKeys.h"
 
 #include <array>
 #include <string_view>

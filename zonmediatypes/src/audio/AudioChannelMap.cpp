@@ -1,6 +1,6 @@
 #include "zonmediatypes/AudioChannelMap.h"
 
-#include "zonmediatypes/src/OrderedChannelLabels.h"
+#include "zonmediatypes/src/audio/OrderedChannelLabels.h"
 
 #include <algorithm>
 #include <utility>

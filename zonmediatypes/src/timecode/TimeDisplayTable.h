@@ -2,7 +2,7 @@
 
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
-#include "zonmediatypes/src/DropFrame.h"
+#include "zonmediatypes/src/time/DropFrame.h"
 
 #include <array>
 #include <cstddef>

@@ -1,6 +1,6 @@
 #include "zonmediatypes/AudioChannelLayout.h"
 
-#include "zonmediatypes/src/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLabels.h"
 
 #include <algorithm>
 #include <array>

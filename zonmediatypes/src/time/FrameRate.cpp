@@ -2,7 +2,7 @@
 
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16String.h"
-#include "zonmediatypes/src/RateText.h"
+#include "zonmediatypes/src/time/RateText.h"
 
 #include <array>
 #include <string>
