@@ -113,6 +113,15 @@ TEST(FrameRateDeathTest, TimesIntegerZeroIsADivideFault)
 	EXPECT_EXIT(multiply(), testing::KilledBySignal(SIGFPE), "");
 }
 
+TEST(FrameRate, IsOrderedByFramesASecond)
+{
+	const std::int64_t durations[] = {-1, -2, kLeast, kMost, kMost - 1, 8'475'667'200, 8'467'200'000, 1, 0};
+	for (const std::int64_t& left : durations)
+		for (const std::int64_t& right : durations)
+			EXPECT_EQ(FewerFramesPerSecond()(FrameRate(left), FrameRate(right)), &left < &right)
+				<< left << ' ' << right;
+}
+
 TEST(FrameRate, HasARatio)
 {
 	static_assert(GetFrameRateRatio(kFrameRate_Video60, kFrameRate_Video30) == 2.0);

@@ -10,11 +10,14 @@
 
 #include <cmath>
 #include <csignal>
+#include <functional>
 #include <iomanip>
 #include <limits>
 #include <locale>
+#include <optional>
 #include <sstream>
 #include <string>
+#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -62,6 +65,30 @@ TEST(TickTimeFrames, MovesByFrames)
 	EXPECT_EQ(Apply(1, [](TickTime& t) { t.AddFrames(90, kFrameRate_VideoPAL); }), 914'457'600'001);
 	EXPECT_EQ(Apply(0, [](TickTime& t) { t.AddFrames(-2, kTen); }), -20);
 	EXPECT_EQ(Apply(0, [](TickTime& t) { t.AddFrames(3, kFrameRate_Zero); }), kMost - 2);   // wraps
+}
+
+TEST(TickTimeFrames, BeginExactlyOrNowhere)
+{
+	const std::tuple<std::int64_t, FrameRate, std::optional<std::int64_t>> cases[] = {
+		{-90, kFrameRate_VideoPAL, -914'457'600'000},
+		{0, kTen, 0},
+		{kMost / 10, kTen, kMost - 7},
+		{kMost / 10 + 1, kTen, std::nullopt},
+		{kLeast / 10, kTen, kLeast + 8},
+		{kLeast / 10 - 1, kTen, std::nullopt},
+		{2, FrameRate(kLeast / 2), kLeast},
+		{-2, FrameRate(kLeast / 2), std::nullopt},
+		{kLeast, FrameRate(-1), std::nullopt},
+		{kLeast, FrameRate(1), kLeast},
+		{0, kFrameRate_Zero, std::nullopt},
+		{1, FrameRate(0), std::nullopt},
+	};
+	for (const auto& [frames, rate, ticks] : cases)
+	{
+		const std::optional<TickTime> time = TickTime::FromFrames(frames, rate);
+		EXPECT_EQ(time.has_value(), ticks.has_value()) << frames;
+		EXPECT_EQ(time.value_or(kTime_Zero).GetTicks(), ticks.value_or(0)) << frames;
+	}
 }
 
 TEST(TickTimeFrames, Aligns)
@@ -137,6 +164,36 @@ TEST(TickTimeArithmetic, WrapsAndTruncates)
 	EXPECT_EQ(Apply(-5, [](TickTime& t) { t = t.Abs() * 3; }), 15);
 }
 
+// Every integer gives what it gives where it fits 32 bits, on either side; wider ones wrap as they do.
+template <class... Integers>
+void ExpectIntegersToScale()
+{
+	const auto expectOne = []<class Integer>(Integer inFive)
+	{
+		EXPECT_EQ((TickTime(-7) * inFive).GetTicks(), -35);
+		EXPECT_EQ((inFive * TickTime(-7)).GetTicks(), -35);
+		EXPECT_EQ((TickTime(-7) / inFive).GetTicks(), -1);
+		EXPECT_EQ((TickTime(-7) % inFive).GetTicks(), -2);
+	};
+	(expectOne(Integers{5}), ...);
+}
+
+TEST(TickTimeArithmetic, TakesAnyNumber)
+{
+	ExpectIntegersToScale<char, short, unsigned short, int, unsigned, long, unsigned long, long long,
+		unsigned long long>();
+	static_assert((2.5 * TickTime(2)).GetTicks() == 5 && (0.5f * TickTime(3)).GetTicks() == 1);
+	static_assert((TickTime(3) * kMost).GetTicks() == kMost - 2 && (TickTime(-3) * ~0ULL).GetTicks() == 3);
+	static_assert((TickTime(kLeast) / -1LL).GetTicks() == kLeast && (TickTime(kMost) / kLeast).GetTicks() == 0);
+	static_assert((TickTime(kLeast) % -1LL).GetTicks() == 0 && (TickTime(kMost) % kLeast).GetTicks() == kMost);
+	constexpr auto kBeyond = static_cast<std::uint64_t>(kLeast);   // 2^63
+	static_assert((TickTime(kLeast) / kBeyond).GetTicks() == -1 && (TickTime(kLeast) % kBeyond).GetTicks() == 0);
+	static_assert((TickTime(kLeast) / (kBeyond + 1)).GetTicks() == 0 && (TickTime(-1) / ~0ULL).GetTicks() == 0);
+	static_assert((TickTime(kLeast) % (kBeyond + 1)).GetTicks() == kLeast && (TickTime(-1) % ~0ULL).GetTicks() == -1);
+	static_assert((TickTime(-25) % TickTime(10)).GetTicks() == -5 && (TickTime(25) % TickTime(-10)).GetTicks() == 5);
+	static_assert((TickTime(kLeast) % TickTime(-1)).GetTicks() == 0);
+}
+
 // ---- Division by zero ------------------------------------------------------------------------------------------------
 
 TEST(ZeroDivisor, IsReportedByEachOperatorBeforeItGoesOn)
@@ -180,11 +237,11 @@ TEST(ZeroDivisor, IsReportedByEachOperatorBeforeItGoesOn)
 TEST(ZeroDivisorDeathTest, OfAnIntegerIsADivideFaultAfterItsReports)
 {
 	testing::FLAGS_gtest_death_test_style = "threadsafe";
-	const auto divide = [](auto inDivisor)
+	const auto divide = [](auto inDivisor, auto inOperation)
 	{
 		std::signal(SIGFPE, SIG_DFL);   // sanitizers have a handler of their own
 		zoncore::config::SetErrorReporter([](auto&&...) {});
-		static_cast<void>(TickTime(1) / inDivisor);
+		static_cast<void>(inOperation(TickTime(1), inDivisor));
 	};
 	// The dialog by default prints each report.
 	const auto reports = [](const std::string& inType)
@@ -193,8 +250,12 @@ TEST(ZeroDivisorDeathTest, OfAnIntegerIsADivideFaultAfterItsReports)
 		return testing::AllOf(testing::HasSubstr(place + "zonmediatypes::TickTime::operator/(" + inType + ") const"),
 			testing::HasSubstr(place + "&zonmediatypes::TickTime::operator/=(" + inType + ")"));
 	};
-	EXPECT_EXIT(divide(0), testing::KilledBySignal(SIGFPE), reports("std::int32_t"));
-	EXPECT_EXIT(divide(0u), testing::KilledBySignal(SIGFPE), reports("std::uint32_t"));
+	const testing::KilledBySignal isFault(SIGFPE);
+	EXPECT_EXIT(divide(0, std::divides<>()), isFault, reports("std::int32_t"));
+	EXPECT_EXIT(divide(0u, std::divides<>()), isFault, reports("std::uint32_t"));
+	EXPECT_EXIT(divide(0ull, std::divides<>()), isFault, testing::HasSubstr("TickTime::operator/=(WideInteger)"));
+	EXPECT_EXIT(divide(0, std::modulus<>()), isFault, testing::HasSubstr("TickTime::operator%=(std::integral)"));
+	EXPECT_EXIT(divide(kTime_Zero, std::modulus<>()), isFault, testing::HasSubstr("inRHS.mTicks != 0"));
 }
 
 // ---- Text ------------------------------------------------------------------------------------------------------------

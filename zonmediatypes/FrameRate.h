@@ -117,6 +117,13 @@ ZONMEDIATYPES_API std::span<const FrameRate> AllFrameRates() noexcept;
 /// kFrameRate_Zero.
 constexpr double GetFrameRateRatio(const FrameRate& inA, const FrameRate& inB) noexcept;
 
+/// Orders rates by frames a second, slower ones first, exactly; for sorting, maps and look-up. kFrameRate_Zero stands between
+/// negative and positive rates, and a duration of 0, which is infinitely fast, last.
+struct FewerFramesPerSecond
+{
+	constexpr bool operator()(FrameRate inLHS, FrameRate inRHS) const noexcept;
+};
+
 /// Writes the rate in frames or samples per second with at most two decimals, kFrameRate_23976 with three: "25", "12.5",
 /// "29.97", "23.976"; kFrameRate_Zero is "0", a duration of 0 "inf". The text is padded as any text; the other settings of
 /// the stream have no effect.
@@ -157,6 +164,12 @@ constexpr double GetFrameRateRatio(const FrameRate& inA, const FrameRate& inB) n
 	if (inA.GetTicksPerFrame() == 0)
 		return 0.0;
 	return static_cast<double>(inB.GetTicksPerFrame()) / static_cast<double>(inA.GetTicksPerFrame());
+}
+
+constexpr bool FewerFramesPerSecond::operator()(FrameRate inLHS, FrameRate inRHS) const noexcept
+{
+	// Longer durations are slower. As unsigned numbers the negative ones come before all others, -1 first, and 0 last.
+	return static_cast<std::uint64_t>(inLHS.GetTicksPerFrame()) > static_cast<std::uint64_t>(inRHS.GetTicksPerFrame());
 }
 
 }   // namespace zonmediatypes

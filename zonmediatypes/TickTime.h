@@ -19,11 +19,18 @@
 #include "zonmediatypes/FrameRate.h"
 
 #include <compare>
+#include <concepts>
 #include <cstdint>
 #include <iosfwd>
+#include <limits>
+#include <optional>
 
 namespace zonmediatypes
 {
+
+/// The integers that do not fit the operators of 32 bits: long, long long, std::size_t and their like.
+template <class T>
+concept WideInteger = std::integral<T> && sizeof(T) > sizeof(std::int32_t);
 
 class TickTime
 {
@@ -32,6 +39,9 @@ public:
 	constexpr TickTime() noexcept = default;
 
 	explicit constexpr TickTime(std::int64_t inTicks) noexcept : mTicks(inTicks) {}
+
+	/// The time at which frame inFrames begins, exactly; empty when it does not fit, or when the rate is not usable.
+	static constexpr std::optional<TickTime> FromFrames(std::int64_t inFrames, FrameRate inRate) noexcept;
 
 	constexpr std::int64_t GetTicks() const noexcept { return mTicks; }
 
@@ -70,23 +80,34 @@ public:
 	constexpr TickTime& operator*=(double inValue) noexcept;
 	constexpr TickTime& operator*=(std::int32_t inValue) noexcept;
 	constexpr TickTime& operator*=(std::uint32_t inValue) noexcept;
+	constexpr TickTime& operator*=(WideInteger auto inValue) noexcept;
 	constexpr TickTime operator*(double inValue) const noexcept { return TickTime(*this) *= inValue; }
 	constexpr TickTime operator*(std::int32_t inValue) const noexcept { return TickTime(*this) *= inValue; }
 	constexpr TickTime operator*(std::uint32_t inValue) const noexcept { return TickTime(*this) *= inValue; }
+	constexpr TickTime operator*(WideInteger auto inValue) const noexcept { return TickTime(*this) *= inValue; }
 
 	/// Truncated toward zero. A divisor of zero violates the contract: it is reported to the contract dialog and then to
 	/// the error reporter, which throws zoncore::config::Error unless the host has installed another. When the reporter
 	/// returns, a division by 0.0 gives the most negative tick count and an integer division is a divide fault (SIGFPE).
-	/// The operators that leave their operand alone report twice, for themselves and for the one that they apply.
+	/// Of these six the operators that leave their operand alone report twice, for themselves and for the one that they apply.
 	constexpr TickTime& operator/=(double inValue);
 	constexpr TickTime& operator/=(std::int32_t inValue);
 	constexpr TickTime& operator/=(std::uint32_t inValue);
 	constexpr TickTime operator/(double inValue) const;
 	constexpr TickTime operator/(std::int32_t inValue) const;
 	constexpr TickTime operator/(std::uint32_t inValue) const;
+	constexpr TickTime& operator/=(WideInteger auto inValue);
+	constexpr TickTime operator/(WideInteger auto inValue) const { return TickTime(*this) /= inValue; }
 
 	/// The ratio of two times. A zero divisor is reported as above; when the reporter returns, the ratio is infinite or NaN.
 	constexpr double operator/(const TickTime& inRHS) const;
+
+	/// What truncated division leaves over, with the sign of this time: t - n * (t / n). By a time, how far this one lies past
+	/// the last multiple of it. A zero divisor is reported as above, once; when the reporter returns, it is a divide fault.
+	constexpr TickTime& operator%=(std::integral auto inValue);
+	constexpr TickTime& operator%=(const TickTime& inRHS);
+	constexpr TickTime operator%(std::integral auto inValue) const { return TickTime(*this) %= inValue; }
+	constexpr TickTime operator%(const TickTime& inRHS) const { return TickTime(*this) %= inRHS; }
 
 	// ---- Sums ----
 
@@ -107,8 +128,21 @@ private:
 	ZONMEDIATYPES_API static void ReportZeroDivisor(
 		const char* inCondition, const char* inSignature, int inLine = __builtin_LINE());
 
+	/// Truncated; a divisor of 0 is a divide fault.
+	constexpr std::int64_t Quotient(std::integral auto inDivisor) const noexcept;
+
 	std::int64_t mTicks = 0;
 };
+
+/// A factor may stand on either side.
+constexpr TickTime operator*(double inValue, const TickTime& inTime) noexcept
+{
+	return inTime * inValue;
+}
+constexpr TickTime operator*(std::integral auto inValue, const TickTime& inTime) noexcept
+{
+	return inTime * inValue;
+}
 
 inline constexpr TickTime kTime_Zero;
 inline constexpr TickTime kTime_Max(360'000 * kTicksPerSecond);   ///< 100 hours: the latest time that clamping gives
@@ -122,6 +156,19 @@ ZONMEDIATYPES_API std::basic_ostream<unsigned short>& operator<<(
 	std::basic_ostream<unsigned short>& inStream, const TickTime& inTime);
 
 // ---- Inline implementation: frames -----------------------------------------------------------------------------------
+
+constexpr std::optional<TickTime> TickTime::FromFrames(std::int64_t inFrames, FrameRate inRate) noexcept
+{
+	if (!inRate.IsUsable())
+		return std::nullopt;
+	const std::int64_t duration = inRate.GetTicksPerFrame();
+	const bool isNegative = (inFrames < 0) != (duration < 0);
+	const std::uint64_t mostTicks = zoncore::utility::Magnitude(
+		isNegative ? std::numeric_limits<std::int64_t>::min() : std::numeric_limits<std::int64_t>::max());
+	if (zoncore::utility::Magnitude(inFrames) > mostTicks / zoncore::utility::Magnitude(duration))
+		return std::nullopt;
+	return TickTime(zoncore::utility::WrappingMultiply(inFrames, duration));
+}
 
 constexpr void TickTime::AddFrames(long long inFrames, const FrameRate& inRate) noexcept
 {
@@ -190,6 +237,12 @@ constexpr TickTime& TickTime::operator*=(std::uint32_t inValue) noexcept
 	return *this;
 }
 
+constexpr TickTime& TickTime::operator*=(WideInteger auto inValue) noexcept
+{
+	mTicks = zoncore::utility::WrappingMultiply(mTicks, static_cast<std::int64_t>(inValue));
+	return *this;
+}
+
 constexpr TickTime& TickTime::operator/=(double inValue)
 {
 	if (inValue == 0.0)
@@ -238,12 +291,50 @@ constexpr TickTime TickTime::operator/(std::uint32_t inValue) const
 	return TickTime(*this) /= inValue;
 }
 
+constexpr TickTime& TickTime::operator/=(WideInteger auto inValue)
+{
+	if (inValue == 0)
+		ReportZeroDivisor("inValue != 0", "zonmediatypes::TickTime &zonmediatypes::TickTime::operator/=(WideInteger)");
+	mTicks = Quotient(inValue);
+	return *this;
+}
+
 constexpr double TickTime::operator/(const TickTime& inRHS) const
 {
 	if (inRHS.mTicks == 0)
 		ReportZeroDivisor(
 			"inRHS.mTicks != 0", "double zonmediatypes::TickTime::operator/(const zonmediatypes::TickTime &) const");
 	return static_cast<double>(mTicks) / static_cast<double>(inRHS.mTicks);
+}
+
+constexpr TickTime& TickTime::operator%=(std::integral auto inValue)
+{
+	if (inValue == 0)
+		ReportZeroDivisor(
+			"inValue != 0", "zonmediatypes::TickTime &zonmediatypes::TickTime::operator%=(std::integral)");
+	const std::int64_t quotient = Quotient(inValue);
+	mTicks = zoncore::utility::WrappingSubtract(
+		mTicks, zoncore::utility::WrappingMultiply(quotient, static_cast<std::int64_t>(inValue)));
+	return *this;
+}
+
+constexpr TickTime& TickTime::operator%=(const TickTime& inRHS)
+{
+	if (inRHS.mTicks == 0)
+		ReportZeroDivisor("inRHS.mTicks != 0",
+			"zonmediatypes::TickTime &zonmediatypes::TickTime::operator%=(const zonmediatypes::TickTime &)");
+	mTicks = zoncore::utility::WrappingRemainder(mTicks, inRHS.mTicks);
+	return *this;
+}
+
+constexpr std::int64_t TickTime::Quotient(std::integral auto inDivisor) const noexcept
+{
+	const auto divisor = static_cast<std::int64_t>(inDivisor);
+	if (std::signed_integral<decltype(inDivisor)> || divisor >= 0)
+		return zoncore::utility::WrappingDivide(mTicks, divisor);
+	// The divisor is 2^63 or more: only the most negative tick count holds it, and only once.
+	constexpr std::int64_t kLeast = std::numeric_limits<std::int64_t>::min();
+	return mTicks == kLeast && divisor == kLeast ? -1 : 0;
 }
 
 // ---- Inline implementation: sums -------------------------------------------------------------------------------------
