@@ -11,6 +11,7 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Export.h"
+#include "zonmediatypes/FieldType.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/PixelAspectRatio.h"
 #include "zonmediatypes/PixelFormat.h"
@@ -18,7 +19,6 @@
 #include "zonmediatypes/TimeDisplayUtils.h"
 
 #include <cstddef>
-#include <cstdint>
 #include <span>
 #include <string_view>
 
@@ -65,17 +65,6 @@ ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescriptionUnlocalized(
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelConfigurationDescription(const AudioChannelLayouts& inStreams);
 
 // ---- Video -----------------------------------------------------------------------------------------------------------
-
-/// The order of the fields of interlaced video.
-enum FieldType : std::int32_t
-{
-	kFieldType_Invalid = -1,   ///< not known whether there are fields
-	kFieldType_NoFields = 0,   ///< progressive
-	kFieldType_UpperFirst = 1,
-	kFieldType_LowerFirst = 2,
-	kFieldType_UnknownDominance = 3,
-	kFieldType_Any = 4,
-};
 
 /// "Draft", "Low", "Medium", "High", "Max".
 ZONMEDIATYPES_API zoncore::UTF16String RenderQualityDescription(RenderQuality inQuality);

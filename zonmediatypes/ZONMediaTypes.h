@@ -11,6 +11,7 @@
 #include "zonmediatypes/AudioFormat.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/Export.h"
+#include "zonmediatypes/FieldType.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/PixelAspectRatio.h"
 #include "zonmediatypes/PixelAspectRatioUtils.h"

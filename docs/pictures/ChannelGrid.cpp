@@ -2,7 +2,7 @@
 
 #include "Pictures.h"
 #include "Svg.h"
-#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLabelTable.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,6 @@
-#include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/AudioChannelConversion.h"
 
-#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLabelTable.h"
 
 #include <algorithm>
 #include <array>

@@ -1,5 +1,6 @@
 #include "zonmediatypes/AudioChannelMap.h"
 
+#include "zonmediatypes/src/audio/KnownLayouts.h"
 #include "zonmediatypes/src/audio/OrderedChannelLabels.h"
 
 #include <algorithm>
@@ -20,21 +21,6 @@ AudioChannelLayout OrderedLayout(std::int32_t inCount)
 	AudioChannelLayout layout(static_cast<std::size_t>(std::max(inCount, 0)), kNoLabel);
 	std::copy_n(sOrderedChannelLabels.begin(), std::min(layout.size(), sOrderedChannelLabels.size()), layout.begin());
 	return layout;
-}
-
-AudioChannelLayout DefaultLayout(std::int32_t inChannelCount)
-{
-	switch (inChannelCount)
-	{
-	case 1:
-		return CreateMonoChannelLayout();
-	case 2:
-		return CreateStereoChannelLayout();
-	case 6:
-		return CreateBroadcast51ChannelLayout();
-	default:
-		return OrderedLayout(inChannelCount);
-	}
 }
 
 }   // namespace
@@ -59,7 +45,8 @@ ChannelMap::~ChannelMap() = default;
 
 ChannelMap ChannelMap::CreateDefaultChannelMap(std::int32_t inChannelCount)
 {
-	ChannelMap map(DefaultLayout(inChannelCount));
+	const auto layout = DefaultLayoutOf(static_cast<std::size_t>(inChannelCount), DefaultFor::MapsAndFormats);
+	ChannelMap map = layout ? ChannelMap(*layout) : ChannelMap(inChannelCount);
 	std::int32_t channel = 0;
 	std::ranges::generate(map.mAssignments, [&] { return channel++; });
 	return map;

@@ -1,26 +1,15 @@
 #include "zonmediatypes/AudioFormat.h"
 
+#include "zonmediatypes/src/audio/KnownLayouts.h"
+
 #include <algorithm>
 #include <tuple>
+#include <utility>
 
 namespace zonmediatypes
 {
 namespace
 {
-
-// The channels of a format of which only the channel count is known.
-AudioChannelLayout DefaultLayout(std::uint32_t inChannelCount)
-{
-	switch (inChannelCount)
-	{
-	case 2:
-		return CreateStereoChannelLayout();
-	case 6:
-		return CreateBroadcast51ChannelLayout();
-	default:
-		return AudioChannelLayout(inChannelCount);
-	}
-}
 
 std::uint32_t BytesPerSample(AudioSampleType inType)
 {
@@ -51,7 +40,8 @@ AudioFormat::~AudioFormat() = default;
 
 AudioFormat AudioFormat::CreateDefaultAudioFormat(std::uint32_t inChannelCount, std::uint32_t inSampleRate)
 {
-	return CreateAudioFormat(DefaultLayout(inChannelCount), inSampleRate);
+	auto layout = DefaultLayoutOf(inChannelCount, DefaultFor::MapsAndFormats);
+	return CreateAudioFormat(layout ? *std::move(layout) : AudioChannelLayout(inChannelCount), inSampleRate);
 }
 
 AudioFormat AudioFormat::CreateAudioFormat(const AudioChannelLayout& inLayout, std::uint32_t inSampleRate)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "zonmediatypes/src/audio/AudioChannelLabels.h"
+#include "zonmediatypes/src/audio/AudioChannelLabelTable.h"
 #include "zonmediatypes/src/text/TextKeys.h"
 
 #include <algorithm>

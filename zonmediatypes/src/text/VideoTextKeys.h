@@ -1,6 +1,6 @@
 #pragma once
 
-#include "zonmediatypes/Descriptions.h"
+#include "zonmediatypes/FieldType.h"
 #include "zonmediatypes/PixelAspectRatio.h"
 #include "zonmediatypes/PixelFormatProperties.h"
 #include "zonmediatypes/PixelFormatSelection.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "zonmediatypes/AudioChannelLayout.h"
+#include "zonmediatypes/AudioChannelLabel.h"
 
 #include <algorithm>
 #include <array>
@@ -108,6 +108,43 @@ constexpr const AudioChannelLabelRow* FindLabelRow(AudioChannelLabel inLabel) no
 {
 	const std::size_t row = FindLabelIndex(inLabel);
 	return row != 0 || inLabel == kAudioChannelLabel_Discrete ? &kAudioChannelLabels[row] : nullptr;
+}
+
+/// The label of an abbreviation; where there is none, what asks does not compile.
+constexpr AudioChannelLabel LabelByAbbreviation(std::string_view inAbbreviation)
+{
+	for (const AudioChannelLabelRow& row : kAudioChannelLabels)
+		if (row.mAbbreviation == inAbbreviation)
+			return row.mLabel;
+	throw "no label has this abbreviation";
+}
+
+/// Calls inTake with each word of a text, in which blanks or underscores stand between words.
+template <class Take>
+constexpr void ForEachWord(std::string_view inText, Take inTake)
+{
+	for (std::size_t begin = 0; begin < inText.size();)
+	{
+		const std::size_t end = std::min(inText.find_first_of(" _", begin), inText.size());
+		if (begin < end)
+			inTake(inText.substr(begin, end - begin));
+		begin = end + 1;
+	}
+}
+
+constexpr std::size_t CountWords(std::string_view inText)
+{
+	std::size_t words = 0;
+	ForEachWord(inText, [&](std::string_view) { ++words; });
+	return words;
+}
+
+/// Writes the labels of a text of abbreviations; returns the end of what it has written.
+template <class Iterator>
+constexpr Iterator ReadLabels(std::string_view inText, Iterator inOut)
+{
+	ForEachWord(inText, [&](std::string_view inWord) { *inOut++ = LabelByAbbreviation(inWord); });
+	return inOut;
 }
 
 /// The index of a row of the table.
