@@ -5,7 +5,9 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <array>
 #include <random>
+#include <span>
 
 namespace zonmediatypes
 {
@@ -193,6 +195,32 @@ TEST(SelectNearestSourcePixelFormat, PrefersCheapThenShallowThenFirst)
 	EXPECT_EQ(select({bgra}, kPixelFormat_Invalid), kPixelFormat_Invalid);
 	EXPECT_EQ(select({bgra}, kPixelFormat_NTSCDV25), kPixelFormat_Invalid) << "nothing becomes DV";
 	EXPECT_EQ(select({}, bgra), kPixelFormat_Invalid);
+}
+
+// A list is a vector, as hosts have it, or anything else that formats lie in.
+TEST(PixelFormatLists, MayBeKeptAnywhere)
+{
+	constexpr PixelFormat kNone{};
+	const PixelFormat uyvy = kPixelFormat_UYVY_422_8u, vuyx = kPixelFormat_VUYX_4444_8u;
+	const std::array array{uyvy, vuyx};
+	const PixelFormats vector(array.begin(), array.end());
+	const std::span<const PixelFormat> span(array);
+	const auto quality = kRenderQuality_High;
+	const auto expect = [&](const auto& inList)
+	{
+		EXPECT_EQ(SelectNearestSourcePixelFormat(inList, vuyx.mProperties, quality), vuyx);
+		EXPECT_EQ(SelectNearestPixelFormat(inList, uyvy, array, quality, false), uyvy);
+		EXPECT_EQ(SelectNearestPixelFormat(vector, uyvy, inList, quality, false), uyvy);
+		EXPECT_EQ(SelectNearestPixelFormat({vuyx}, uyvy, inList, quality, false), vuyx);
+		EXPECT_EQ(SelectNearestPixelFormat(inList, uyvy, {}, quality, false), vuyx);
+	};
+	expect(vector);
+	expect(array);
+	expect(span);
+	EXPECT_EQ(SelectNearestPixelFormat({uyvy}, uyvy, {uyvy, vuyx}, quality, false), uyvy);
+	EXPECT_EQ(SelectNearestPixelFormat({}, uyvy, {}, quality, false), kNone);
+	EXPECT_EQ(SelectNearestSourcePixelFormat({uyvy, vuyx}, vuyx.mProperties, quality), vuyx);
+	EXPECT_EQ(SelectNearestSourcePixelFormat({}, vuyx.mProperties, quality), kNone);
 }
 
 // ---- Working formats -------------------------------------------------------------------------------------------------

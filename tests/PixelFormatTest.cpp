@@ -27,7 +27,7 @@ const PixelFormatProperties sSeenEarly = []
 }();
 
 static_assert(kPixelFormatProperties_Invalid.GetValue() == 0x3C000 && kPixelFormatProperties_Any.GetValue() == 0xBC000);
-static_assert(MakePixelFormatName('v', 'u', 'y', 'a') == 0x61797576);
+static_assert(MakePixelFormatName("vuya") == 0x61797576 && kPixelFormatFourCC_VUYA_4444_8u == 0x61797576);
 static_assert(MakePixelFormatName('\xFF', '\x80', '\0', '\xFE') == 0xFE0080FF);
 
 // ---- The catalogue ---------------------------------------------------------------------------------------------------

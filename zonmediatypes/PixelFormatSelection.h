@@ -17,7 +17,10 @@
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/PixelFormat.h"
 
+#include <concepts>
 #include <cstdint>
+#include <initializer_list>
+#include <span>
 
 namespace zonmediatypes
 {
@@ -34,6 +37,29 @@ enum RenderQuality : std::int32_t
 
 /// A list of formats; in the order of preference where formats tie.
 using PixelFormats = zoncore::utility::SmallBlockAllocator::vector<PixelFormat>;
+
+/// A list of formats that a function looks at, wherever it is kept: a vector, an array, a span, or braces in the call.
+class PixelFormatView
+{
+public:
+	template <class List>
+		requires std::constructible_from < std::span<const PixelFormat>,
+	const List& > constexpr PixelFormatView(const List& inFormats) noexcept   // NOLINT(google-explicit-constructor)
+		: mFormats(inFormats)
+	{
+	}
+	constexpr PixelFormatView(std::initializer_list<PixelFormat> inFormats) noexcept
+		: mFormats(inFormats.begin(), inFormats.size())
+	{
+	}
+
+	constexpr const PixelFormat* begin() const noexcept { return mFormats.data(); }
+	constexpr const PixelFormat* end() const noexcept { return mFormats.data() + mFormats.size(); }
+	constexpr bool empty() const noexcept { return mFormats.empty(); }
+
+private:
+	std::span<const PixelFormat> mFormats;
+};
 
 /// The cost of a conversion that cannot be done, and the highest of all.
 inline constexpr int kPixelConversionCost_Impossible = 10'000;
@@ -55,11 +81,20 @@ ZONMEDIATYPES_API int PixelConversionCost(
 ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats,
 	PixelFormat inRequestedFormat, const PixelFormats& inDestinationFormats, RenderQuality inQuality,
 	bool inPreferRequested) noexcept;
+ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(PixelFormatView inSourceFormats, PixelFormat inRequestedFormat,
+	PixelFormatView inDestinationFormats, RenderQuality inQuality, bool inPreferRequested) noexcept;
+inline PixelFormat SelectNearestPixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
+	PixelFormat inRequestedFormat, std::initializer_list<PixelFormat> inDestinationFormats, RenderQuality inQuality,
+	bool inPreferRequested) noexcept;
 
 /// The source format that converts most cheaply to inTarget, of several the shallowest, of those the first; for the
 /// wildcard the first concrete one that is not custom. kPixelFormat_Invalid when there is none.
 ZONMEDIATYPES_API PixelFormat SelectNearestSourcePixelFormat(
 	const PixelFormats& inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
+ZONMEDIATYPES_API PixelFormat SelectNearestSourcePixelFormat(
+	PixelFormatView inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
+inline PixelFormat SelectNearestSourcePixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
+	PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
 
 /// The built-in format with full chroma and a fourth component in which frames of inFormat are processed: inFormat itself
 /// when it is one; else 8-bit for 8-bit, and for deeper ones 32-bit float at high quality and 8-bit at low. YUV of full
@@ -68,5 +103,23 @@ ZONMEDIATYPES_API PixelFormat Select4444PixelFormat(PixelFormat inFormat, Render
 
 /// The uncompressed format that a DV format decompresses into; every other format as it is.
 ZONMEDIATYPES_API PixelFormat SelectDVDecompressionFormat(PixelFormat inFormat) noexcept;
+
+// ---- Inline implementation -------------------------------------------------------------------------------------------
+
+// Braces in a call mean these, since the functions of vectors and views are equally far from them.
+
+inline PixelFormat SelectNearestPixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
+	PixelFormat inRequestedFormat, std::initializer_list<PixelFormat> inDestinationFormats, RenderQuality inQuality,
+	bool inPreferRequested) noexcept
+{
+	return SelectNearestPixelFormat(PixelFormatView(inSourceFormats), inRequestedFormat,
+		PixelFormatView(inDestinationFormats), inQuality, inPreferRequested);
+}
+
+inline PixelFormat SelectNearestSourcePixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
+	PixelFormatProperties inTarget, RenderQuality inQuality) noexcept
+{
+	return SelectNearestSourcePixelFormat(PixelFormatView(inSourceFormats), inTarget, inQuality);
+}
 
 }   // namespace zonmediatypes

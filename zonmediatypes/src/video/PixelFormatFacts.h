@@ -105,7 +105,7 @@ consteval bool Says(std::string_view inName, std::string_view inWord)
 struct Row
 {
 	std::string_view mConstant;
-	std::string_view mCode;
+	PixelFormatName mName;
 	Model mModel;
 	Depth mDepth;
 	Matrix mMatrix;
@@ -116,10 +116,10 @@ struct Row
 	Light mLight = Gamma;
 	PixelFormatCompression mCompression = Uncompressed;
 
-	consteval Row(std::string_view inConstant, std::string_view inCode, Model inModel, Depth inDepth, Matrix inMatrix,
+	consteval Row(std::string_view inConstant, PixelFormatName inName, Model inModel, Depth inDepth, Matrix inMatrix,
 		Range inRange, PixelFormatAlpha inAlpha, Chroma inChroma, Order inOrder = Usual, Light inLight = Gamma)
 		: mConstant(inConstant),
-		  mCode(inCode),
+		  mName(inName),
 		  mModel(inModel),
 		  mDepth(inDepth),
 		  mMatrix(inMatrix),
@@ -130,9 +130,9 @@ struct Row
 		  mLight(inLight)
 	{
 	}
-	consteval Row(std::string_view inConstant, std::string_view inCode, Model inModel, Depth inDepth, Matrix inMatrix,
+	consteval Row(std::string_view inConstant, PixelFormatName inName, Model inModel, Depth inDepth, Matrix inMatrix,
 		Range inRange, PixelFormatAlpha inAlpha, Chroma inChroma, PixelFormatCompression inCompression)
-		: Row(inConstant, inCode, inModel, inDepth, inMatrix, inRange, inAlpha, inChroma)
+		: Row(inConstant, inName, inModel, inDepth, inMatrix, inRange, inAlpha, inChroma)
 	{
 		mCompression = inCompression;
 	}
@@ -195,12 +195,10 @@ consteval void CheckName(const Row& inRow)
 
 consteval PixelFormat Format(const Row& inRow)
 {
-	if (inRow.mCode.size() != 4)
-		throw "a code has four characters";
 	const PixelFormatProperties properties = Properties(inRow);
 	CheckFacts(properties);
 	CheckName(inRow);
-	return {MakePixelFormatName(inRow.mCode[0], inRow.mCode[1], inRow.mCode[2], inRow.mCode[3]), properties};
+	return {inRow.mName, properties};
 }
 
 }   // namespace zonmediatypes::catalogue

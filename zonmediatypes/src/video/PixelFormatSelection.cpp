@@ -96,7 +96,7 @@ int ConversionCost(PixelFormatProperties inFrom, PixelFormatProperties inTo, Ren
 
 // ---- Lists -----------------------------------------------------------------------------------------------------------
 
-bool Contains(const PixelFormats& inFormats, PixelFormat inFormat)
+bool Contains(PixelFormatView inFormats, PixelFormat inFormat)
 {
 	return std::ranges::find(inFormats, inFormat) != inFormats.end();
 }
@@ -117,13 +117,13 @@ bool IsKnownAndConcrete(PixelFormat inFormat)
 }
 
 template <class Predicate>
-PixelFormat FirstThat(const PixelFormats& inFormats, Predicate inPredicate)
+PixelFormat FirstThat(PixelFormatView inFormats, Predicate inPredicate)
 {
 	const auto found = std::ranges::find_if(inFormats, inPredicate);
 	return found != inFormats.end() ? *found : kPixelFormat_Invalid;
 }
 
-PixelFormat FirstCommon(const PixelFormats& inSourceFormats, const PixelFormats& inDestinationFormats)
+PixelFormat FirstCommon(PixelFormatView inSourceFormats, PixelFormatView inDestinationFormats)
 {
 	return FirstThat(inDestinationFormats,
 		[&](PixelFormat inFormat)
@@ -131,7 +131,7 @@ PixelFormat FirstCommon(const PixelFormats& inSourceFormats, const PixelFormats&
 }
 
 // A format to work in: one with a fourth component, or any that is concrete.
-PixelFormat FirstWorkable(const PixelFormats& inFormats)
+PixelFormat FirstWorkable(PixelFormatView inFormats)
 {
 	const PixelFormat format = FirstThat(inFormats, Is4444);
 	return format != kPixelFormat_Invalid ? format : FirstThat(inFormats, IsKnownAndConcrete);
@@ -146,7 +146,7 @@ public:
 	{
 	}
 
-	void Search(const PixelFormats& inSourceFormats, const PixelFormats& inDestinationFormats, bool inAcceptsAny)
+	void Search(PixelFormatView inSourceFormats, PixelFormatView inDestinationFormats, bool inAcceptsAny)
 	{
 		for (const PixelFormat source : inSourceFormats)
 			for (const PixelFormat destination : inDestinationFormats)
@@ -222,6 +222,13 @@ int PixelConversionCost(
 PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats, PixelFormat inRequestedFormat,
 	const PixelFormats& inDestinationFormats, RenderQuality inQuality, bool inPreferRequested) noexcept
 {
+	return SelectNearestPixelFormat(PixelFormatView(inSourceFormats), inRequestedFormat,
+		PixelFormatView(inDestinationFormats), inQuality, inPreferRequested);
+}
+
+PixelFormat SelectNearestPixelFormat(PixelFormatView inSourceFormats, PixelFormat inRequestedFormat,
+	PixelFormatView inDestinationFormats, RenderQuality inQuality, bool inPreferRequested) noexcept
+{
 	if (inPreferRequested && Contains(inDestinationFormats, inRequestedFormat))
 		return inRequestedFormat;
 	const bool acceptsAny = Contains(inDestinationFormats, kPixelFormat_Any);
@@ -243,6 +250,12 @@ PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats, PixelF
 
 PixelFormat SelectNearestSourcePixelFormat(
 	const PixelFormats& inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept
+{
+	return SelectNearestSourcePixelFormat(PixelFormatView(inSourceFormats), inTarget, inQuality);
+}
+
+PixelFormat SelectNearestSourcePixelFormat(
+	PixelFormatView inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept
 {
 	if (inTarget.Kind() == kPixelFormatKind_Any)
 		return FirstThat(inSourceFormats, IsKnownAndConcrete);
