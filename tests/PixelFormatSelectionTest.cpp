@@ -202,8 +202,8 @@ TEST(PixelFormatLists, MayBeKeptAnywhere)
 {
 	constexpr PixelFormat kNone{};
 	const PixelFormat uyvy = kPixelFormat_UYVY_422_8u, vuyx = kPixelFormat_VUYX_4444_8u;
-	const std::array array{uyvy, vuyx};
-	const PixelFormats vector(array.begin(), array.end());
+	const PixelFormat array[] = {uyvy, vuyx};
+	const PixelFormats vector(std::begin(array), std::end(array));
 	const std::span<const PixelFormat> span(array);
 	const auto quality = kRenderQuality_High;
 	const auto expect = [&](const auto& inList)
@@ -216,6 +216,7 @@ TEST(PixelFormatLists, MayBeKeptAnywhere)
 	};
 	expect(vector);
 	expect(array);
+	expect(std::to_array(array));
 	expect(span);
 	EXPECT_EQ(SelectNearestPixelFormat({uyvy}, uyvy, {uyvy, vuyx}, quality, false), uyvy);
 	EXPECT_EQ(SelectNearestPixelFormat({}, uyvy, {}, quality, false), kNone);

@@ -42,9 +42,8 @@ using PixelFormats = zoncore::utility::SmallBlockAllocator::vector<PixelFormat>;
 class PixelFormatView
 {
 public:
-	template <class List>
-		requires std::constructible_from < std::span<const PixelFormat>,
-	const List& > constexpr PixelFormatView(const List& inFormats) noexcept   // NOLINT(google-explicit-constructor)
+	template <std::convertible_to<std::span<const PixelFormat>> List>
+	constexpr PixelFormatView(const List& inFormats) noexcept   // NOLINT(google-explicit-constructor)
 		: mFormats(inFormats)
 	{
 	}
@@ -81,6 +80,7 @@ ZONMEDIATYPES_API int PixelConversionCost(
 ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats,
 	PixelFormat inRequestedFormat, const PixelFormats& inDestinationFormats, RenderQuality inQuality,
 	bool inPreferRequested) noexcept;
+/// The same of lists that are no PixelFormats.
 ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(PixelFormatView inSourceFormats, PixelFormat inRequestedFormat,
 	PixelFormatView inDestinationFormats, RenderQuality inQuality, bool inPreferRequested) noexcept;
 inline PixelFormat SelectNearestPixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
@@ -91,6 +91,7 @@ inline PixelFormat SelectNearestPixelFormat(std::initializer_list<PixelFormat> i
 /// wildcard the first concrete one that is not custom. kPixelFormat_Invalid when there is none.
 ZONMEDIATYPES_API PixelFormat SelectNearestSourcePixelFormat(
 	const PixelFormats& inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
+/// The same of a list that is no PixelFormats.
 ZONMEDIATYPES_API PixelFormat SelectNearestSourcePixelFormat(
 	PixelFormatView inSourceFormats, PixelFormatProperties inTarget, RenderQuality inQuality) noexcept;
 inline PixelFormat SelectNearestSourcePixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
@@ -106,7 +107,7 @@ ZONMEDIATYPES_API PixelFormat SelectDVDecompressionFormat(PixelFormat inFormat) 
 
 // ---- Inline implementation -------------------------------------------------------------------------------------------
 
-// Braces in a call mean these, since the functions of vectors and views are equally far from them.
+// Braces in a call mean these two: to the functions of vectors and of views they would be equally near.
 
 inline PixelFormat SelectNearestPixelFormat(std::initializer_list<PixelFormat> inSourceFormats,
 	PixelFormat inRequestedFormat, std::initializer_list<PixelFormat> inDestinationFormats, RenderQuality inQuality,

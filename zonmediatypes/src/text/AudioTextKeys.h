@@ -51,7 +51,7 @@ class LabelKeys
 		return length;
 	}
 
-	// All keys, one behind the other.
+	// All keys, one after the other.
 	static constexpr auto sCharacters = []
 	{
 		std::array<char, TotalLength()> characters{};

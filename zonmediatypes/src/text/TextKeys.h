@@ -38,7 +38,7 @@ consteval std::array<std::string_view, inCount> KeysOf(const std::array<KeyFor<V
 	return keys;
 }
 
-/// Lists of keys, one behind the other.
+/// Lists of keys, one after the other.
 template <std::size_t... inCounts>
 consteval std::array<std::string_view, (inCounts + ... + 0)> JoinKeys(
 	const std::array<std::string_view, inCounts>&... inKeys)
