@@ -6,8 +6,6 @@
 ///     ChannelConversionMatrix matrix;
 ///     ComputeChannelConversionMatrix(CreateBroadcast51ChannelLayout(), CreateStereoChannelLayout(), matrix);
 ///     // L takes L and R takes R; centre, LFE and surrounds are routed nowhere
-///
-/// When memory runs out, output arguments are left as they were.
 
 #include "zoncore/SmallBlockAllocator.h"
 #include "zonmediatypes/AudioChannelLabel.h"
@@ -30,42 +28,49 @@ using ChannelOrdering = zoncore::utility::SmallBlockAllocator::vector<unsigned l
 ZONMEDIATYPES_API void CreateIdentityChannelConversionMatrix(
 	unsigned long inSourceChannelCount, unsigned long inDestinationChannelCount, ChannelConversionMatrix& outMatrix);
 
-/// The matrix that routes inSource into inDestination by label.
+/// The matrix that routes inSource into inDestination by label, in time and memory in proportion to the product of the
+/// channel counts. Each destination channel takes what the first line that fits it says:
 ///
-/// Without labels to go by, when either layout is empty or all `Discrete` and neither has exactly one channel, the matrix
-/// is the identity. Otherwise each destination channel takes, at the first of these rules that fits:
-///  - having a label, the first source channel of the same label;
-///  - a source's only channel, when that is `Discrete`: it feeds every channel at full gain, LFE included;
-///  - being the k-th `Discrete` one, the k-th `Discrete` source channel;
-///  - having a speaker position, all source channels whose speakers are nearest to it, in equal shares (1, 1/2, 1/3, ...).
-///    LFE, LFE2 and `Discrete` have no position, on either side;
-///  - being the only destination channel and `Discrete`, all source channels in equal shares, LFE included;
-///  - nothing: the channel is silent.
+/// | destination channel                                | takes                                                        |
+/// |----------------------------------------------------|--------------------------------------------------------------|
+/// | any, where the source is a single `Discrete` one   | that one at full gain, LFE included                          |
+/// | with a label that the source has, too              | the first source channel of that label                       |
+/// | with a speaker: a label but LFE and LFE2           | the nearest speakers of the source, in equal shares (1, 1/2) |
+/// | the k-th `Discrete` one                            | the k-th `Discrete` source channel                           |
+/// | `Discrete`, and the only one                       | all source channels in equal shares, LFE included            |
+/// | every other                                        | nothing                                                      |
 ///
-/// Speakers stand on a grid of -2 ... 2 from left to right, from below to above ear level and from behind to in front: L at
+/// Where a layout is empty or all `Discrete`, and neither has exactly one channel, the matrix is the identity.
+///
+/// | from            | to              | gives                                                                           |
+/// |-----------------|-----------------|---------------------------------------------------------------------------------|
+/// | L R             | L R C LFE Ls Rs | L to L and Ls, R to R and Rs, half of each to C, nothing to LFE                 |
+/// | L R C LFE Ls Rs | L R             | L and R; the others are dropped, unreported: the matrix does not fold down      |
+/// | `Discrete` one  | L LFE           | the same channel twice                                                          |
+/// | L R             | `Discrete` one  | half of each                                                                    |
+/// | `Discrete` two  | L               | silence, as C into two `Discrete` ones                                          |
+///
+/// Speakers stand on a grid of -2 ... 2 from left to right, from below to above ear level and from back to front: L at
 /// (-2, 0, 2), Lc (-1, 0, 2), Lsd (-2, 0, 0), Pl (-1, 0, 0), Ls (-2, 0, -2); Vhl, Tsl and Tbl 2 above L, Lsd and Ls, and Bfl 2
 /// below L. The right mirrors the left, centres stand between them. Lw shares the place of L, Rls that of Ls, Lt that of Lsd;
 /// X, Y and Z have those of Lsd, Ts and C. W and numbers that name no label are at (0, 0, 0). Distances are Euclidean.
-///
-/// The matrix routes, it does not fold down: 5.1 to stereo drops centre, LFE and surrounds. Nothing reports source channels
-/// that no destination takes. Two unlabelled channels into one labelled one, or the reverse, are silent.
-///
-/// Takes time and memory in proportion to the product of the two channel counts.
 ZONMEDIATYPES_API void ComputeChannelConversionMatrix(
 	const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, ChannelConversionMatrix& outMatrix);
 
+// ---- Orderings and labels --------------------------------------------------------------------------------------------
+//
+// Both take time and memory as sorting the channels does.
+
 /// Finds for each destination channel the first source channel of the same label; the k-th `Discrete` one takes the k-th
 /// `Discrete` source channel. False, and outOrdering untouched, when the layouts differ in size or a channel finds none;
-/// but an empty destination succeeds with an empty ordering whatever the source holds.
-///
-/// A destination that repeats a label takes the same source channel each time: the ordering need not be a permutation.
-/// Takes time and memory as sorting the channels does.
+/// but an empty destination succeeds with an empty ordering whatever the source holds. A destination that repeats a label
+/// takes the same source channel each time: the ordering need not be a permutation.
 ZONMEDIATYPES_API bool RemapChannelOrdering(
 	const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, ChannelOrdering& outOrdering);
 
 /// Gives the `Discrete` channels of inSource, in order, those labels of inDestination that it does not carry yet, each
 /// once; its other channels stay as they are. False, and outLayout untouched, when no channel received a label. outLayout
-/// may be one of the inputs. Takes time and memory as sorting the channels of both layouts does.
+/// may be one of the inputs.
 ZONMEDIATYPES_API bool ReplaceDiscreteLabelsWithDestinationLayoutLabels(
 	const AudioChannelLayout& inSource, const AudioChannelLayout& inDestination, AudioChannelLayout& outLayout);
 

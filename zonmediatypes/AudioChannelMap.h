@@ -19,8 +19,7 @@ namespace zonmediatypes
 ///     map.SetDeviceChannelIndexForChannelLabel(kAudioChannelLabel_FrontLeft, 1);   // R and L to channel 1
 ///     map.GetSourceChannelIndexForChannelLabel(kAudioChannelLabel_FrontLeft);      // 1
 ///
-/// An entry's number outside the map is harmless: there is nothing to get there, and nothing to set. When memory runs out,
-/// members that grow the map throw and leave it as it was.
+/// An entry's number outside the map is harmless: there is nothing to get there, and nothing to set.
 class ZONMEDIATYPES_API ChannelMap
 {
 public:

@@ -25,8 +25,7 @@ enum AudioSampleType : std::int32_t
 /// The sample rate that says that none is known.
 inline constexpr std::int32_t kAudioSampleRate_Invalid = -1;
 
-/// A format; meant to be derived from by what adds fields of its own. When memory runs out, members that copy a layout
-/// throw and leave the format as it was.
+/// A format; meant to be derived from by what adds fields of its own.
 ///
 ///     AudioFormat format = AudioFormat::CreateDefaultAudioFormat(6, 48000);   // L R C LFE Ls Rs, 32 bits
 ///     format.SetSampleType(kAudioSampleType_24Bit);

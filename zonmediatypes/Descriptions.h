@@ -4,8 +4,7 @@
 /// Display text for every value of the library.
 ///
 /// Words come from the localiser (zoncore/Localizer.h) by key; numbers and abbreviations are filled in. A value that a
-/// function does not know gives an empty text, and no key is looked up for it. Each function returns a new text, takes no
-/// lock of this library and may be called from any thread. It throws what a string throws when memory runs out.
+/// function does not know gives an empty text, and no key is looked up for it.
 
 #include "zoncore/Geometry.h"
 #include "zoncore/UTF16String.h"
@@ -51,17 +50,24 @@ ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviations(AudioChann
 /// The short form of a label in English, never translated.
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLabelAbbreviationsUnlocalized(AudioChannelLabel inLabel);
 
-/// One line for a layout: "0 Channels", "Mono" and "6 Channels" without labels; "Stereo", "5.1 (L, R, C, LFE, Ls, Rs)" and
-/// "SMPTE DTV (L R C LFE Ls Rs Lt Rt)" for well-known ones, of which only 5.1 is known in any order; for others their
-/// labels, "4 Channels (L R Ls Rs)", of which more than eight channels show the first seven,
-/// "24 Channels (L R C LFE Ls Rs Lc...)". A number that names no label shows as nothing: "1 Channel ()".
+/// One line for a layout:
+///
+/// | layout                                        | text                                  |
+/// |-----------------------------------------------|---------------------------------------|
+/// | empty, one channel, more, all `Discrete`      | "0 Channels", "Mono", "6 Channels"    |
+/// | L R                                           | "Stereo"                              |
+/// | the channels of 5.1 in any order              | "5.1 (L, R, Ls, Rs, C, LFE)"          |
+/// | L R C LFE Ls Rs Lt Rt                         | "SMPTE DTV (L R C LFE Ls Rs Lt Rt)"   |
+/// | up to eight others                            | "4 Channels (L R Ls Rs)"              |
+/// | more than eight: the first seven              | "24 Channels (L R C LFE Ls Rs Lc...)" |
+/// | a number that names no label shows as nothing | "1 Channel ()"                        |
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescription(const AudioChannelLayout& inLayout);
 
-/// The untranslated abbreviations of all channels, each with a comma behind it, also the last: "L,R,". For machines.
+/// The untranslated abbreviations of all channels, each with a comma after it, also the last: "L,R,". For machines.
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelLayoutDescriptionUnlocalized(const AudioChannelLayout& inLayout);
 
-/// One line for all streams of a clip: a layout's description for a single one, "3 x Stereo" for equal ones, "Stereo + Mono"
-/// for two that differ, "3 Audio Streams" for more, "(No Audio Streams)". Channels in another order make another layout.
+/// One line for all streams of a clip: "(No Audio Streams)", for one its layout's description, "3 x Stereo" for equal ones,
+/// "Stereo + Mono" for two that differ, "3 Audio Streams" for more. Channels in another order make another layout.
 ZONMEDIATYPES_API zoncore::UTF16String AudioChannelConfigurationDescription(const AudioChannelLayouts& inStreams);
 
 // ---- Video -----------------------------------------------------------------------------------------------------------
@@ -72,10 +78,18 @@ ZONMEDIATYPES_API zoncore::UTF16String RenderQualityDescription(RenderQuality in
 /// "Upper Field First", "No Fields (Progressive Scan)".
 ZONMEDIATYPES_API zoncore::UTF16String FieldTypeDescription(FieldType inType);
 
-/// "BGRA 4444 8u", "VUYA 4444 32f 709", "NTSC DV 50", "YUV 420 MPEG2 Frame 8u Full Range". Formed from the properties:
-/// UYVY is "VUY 422 8u", YUYV "YUV 422 8u" and r210 "BGR 4444 10u". The name stands only in the texts of custom formats and
-/// of unknown compression, its characters from the last to the first (deliberate): "Custom Pixel Format (cba_)". The wildcard
-/// is "Any Pixel Format", what is invalid "Unknown Pixel Format"; a compression code that is not assigned has no text.
+/// What the properties say; the name counts in custom formats and unknown compression only:
+///
+/// | format                                   | text                                                         |
+/// |------------------------------------------|--------------------------------------------------------------|
+/// | uncompressed                             | "BGRA 4444 8u", "VUYA 4444 32f 709", "ARGB 4444 32f Linear"  |
+/// | UYVY, YUYV, r210                         | "VUY 422 8u", "YUV 422 8u", "BGR 4444 10u"                   |
+/// | DV, in every language                    | "NTSC DV 50", "PAL DV 100 (1080i)"                           |
+/// | MPEG                                     | "YUV 420 MPEG2 Frame 8u", "... 709", "... 709 Full Range"    |
+/// | the wildcard; what is invalid            | "Any Pixel Format"; "Unknown Pixel Format"                   |
+/// | custom "_abc", last character first      | "Custom Pixel Format (cba_)" (deliberate)                    |
+/// | of unknown compression                   | "Unknown Compressed Pixel Format (avdx)"                     |
+/// | with a compression that is not assigned  | ""                                                           |
 ZONMEDIATYPES_API zoncore::UTF16String PixelFormatDescription(PixelFormat inFormat);
 
 /// The name of the first well-known shape that is equal under the tolerant comparison, with the ratio as a number:

@@ -99,9 +99,7 @@ inline constexpr PixelAspectRatio kPixelAspectRatio_DVPALWide_Incorrect(1024, 72
 /// The 15 constants in the order above; for menus and tools.
 ZONMEDIATYPES_API std::span<const PixelAspectRatio> AllPixelAspectRatios() noexcept;
 
-// ======================================================================================================================
-// Inline implementation
-// ======================================================================================================================
+// ---- Inline implementation -------------------------------------------------------------------------------------------
 
 constexpr void PixelAspectRatio::SetValue(unsigned int inNumerator, unsigned int inDenominator) noexcept
 {

@@ -5,8 +5,6 @@
 ///
 ///     const zoncore::RectT<int> stored{0, 0, 720, 480};
 ///     AdjustPixelAspectRectToSquarePixelRect(stored, kPixelAspectRatio_DVNTSC);   // {0, 0, 655, 480}
-///
-/// Pure functions of their arguments, which throw nothing.
 
 #include "zoncore/Geometry.h"
 #include "zonmediatypes/Export.h"

@@ -228,9 +228,7 @@ ZONMEDIATYPES_API extern const PixelFormat kPixelFormat_YUV_420_MPEG4_FRAME_PICT
 ZONMEDIATYPES_API extern const PixelFormat kPixelFormat_YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_709_FullRange;
 ZONMEDIATYPES_API extern const PixelFormat kPixelFormat_YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_709_FullRange;
 
-// ======================================================================================================================
-// Inline implementation
-// ======================================================================================================================
+// ---- Inline implementation -------------------------------------------------------------------------------------------
 
 constexpr bool IsCustomPixelFormatName(PixelFormatName inName) noexcept
 {

@@ -15,7 +15,7 @@
 ///     GuessNameForProperties(properties);                    // "bgrp"
 ///
 /// Every 32-bit value is a legal one and is kept as it is, unassigned codes and unused bits included; comparison sees all
-/// 32 bits. Nothing here throws or allocates.
+/// 32 bits.
 
 #include <cstdint>
 

@@ -10,8 +10,8 @@
 ///         kRenderQuality_High);                                                 // 26: alpha is lost
 ///     Select4444PixelFormat(kPixelFormat_UYVY_422_8u, kRenderQuality_High);     // kPixelFormat_VUYX_4444_8u
 ///
-/// Pure functions of their arguments, which take no lock, allocate nothing and throw nothing; the registry of custom
-/// formats is not asked. Lists may be empty, may repeat formats, and may hold invalid, custom and wildcard ones.
+/// Lists may be empty, may repeat formats, and may hold invalid, custom and wildcard ones; the registry of custom formats
+/// is not asked.
 
 #include "zoncore/SmallBlockAllocator.h"
 #include "zonmediatypes/Export.h"

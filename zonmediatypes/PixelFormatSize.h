@@ -7,8 +7,8 @@
 ///     UncompressedPixelFormatRowBytes(kPixelFormat_V210_422_10u, 1280);          // 3,456: rows padded to 128 bytes
 ///     PixelFormatSize(kPixelFormat_NTSCDV25, 1, 1);                              // 120,000: DV frames are all alike
 ///
-/// Pure functions of their arguments, which throw nothing. Widths and heights are not checked: negative ones give negative
-/// byte counts, and 32-bit row arithmetic wraps for very large ones. Check both before allocating.
+/// Widths and heights are not checked: negative ones give negative byte counts, and 32-bit row arithmetic wraps for very
+/// large ones. Check both before allocating.
 
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/PixelAspectRatio.h"

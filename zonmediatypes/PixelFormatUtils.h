@@ -25,19 +25,17 @@ ZONMEDIATYPES_API const PixelFormat* AllPixelFormatsEnd() noexcept;
 ZONMEDIATYPES_API std::string_view PixelFormatCatalogueName(PixelFormat inFormat) noexcept;
 
 /// Records the properties of a custom format, in place of earlier ones under that name. Nothing is validated: a name that
-/// does not begin with "_" or "@" is recorded and never found again (deliberate). There is no removal. Safe on any thread.
-/// Throws boost::lock_error, or std::bad_alloc when memory runs out; the registry is then as before.
+/// does not begin with "_" or "@" is recorded and never found again (deliberate). There is no removal.
 ZONMEDIATYPES_API void RegisterCustomPixelFormatProperties(unsigned int inName, PixelFormatProperties inProperties);
 
 /// The properties of a built-in or registered format: kPixelFormatProperties_Any for the wildcard's name,
-/// kPixelFormatProperties_Invalid for "badf" and for names that are not known. A built-in name costs one multiplication,
-/// two reads and no lock; a custom one takes the registry's lock, where boost::lock_error may be thrown, and time
-/// in proportion to the logarithm of the number of registered formats.
+/// kPixelFormatProperties_Invalid for "badf" and for names that are not known. A built-in name costs one multiplication
+/// and two reads; a custom one takes the registry's lock, and time in proportion to the logarithm of the number of registered
+/// formats.
 ZONMEDIATYPES_API PixelFormatProperties LookupPropertiesForName(PixelFormatName inName);
 
 /// The built-in name with exactly these properties, in all 32 bits: kPixelFormatFourCC_Any for kind "any", "badf" for
-/// invalid properties, for unknown compression and for what no built-in format has. Custom names are never given. Takes
-/// no lock.
+/// invalid properties, for unknown compression and for what no built-in format has. Custom names are never given.
 ZONMEDIATYPES_API PixelFormatName GuessNameForProperties(PixelFormatProperties inProperties) noexcept;
 
 }   // namespace zonmediatypes

@@ -17,58 +17,41 @@ using zoncore::utility::WrappingMultiply;
 
 // ---- DV --------------------------------------------------------------------------------------------------------------
 
-struct DVSize
+struct DVFrame
 {
 	std::int32_t mCompression;
 	std::int32_t mWidth;
 	std::int32_t mHeight;
-	std::int32_t mFrameBytes;
+	std::int32_t mBytes;
+	PixelAspectRatio mShape;
+	PixelAspectRatio mWideShape = mShape;
 };
 
-constexpr auto sDVSizes = std::to_array<DVSize>({
-	{kPixelFormatCompression_NTSCDV25, 720, 480, 120'000},
-	{kPixelFormatCompression_PALDV25, 720, 576, 144'000},
-	{kPixelFormatCompression_NTSCDV50, 720, 480, 240'000},
-	{kPixelFormatCompression_PALDV50, 720, 576, 288'000},
-	{kPixelFormatCompression_NTSCDV100_720p, 960, 720, 240'000},
-	{kPixelFormatCompression_PALDV100_720p, 960, 720, 288'000},
-	{kPixelFormatCompression_NTSCDV100_1080i, 1280, 1080, 480'000},
-	{kPixelFormatCompression_PALDV100_1080i, 1440, 1080, 576'000},
+// clang-format off
+constexpr auto sDVFrames = std::to_array<DVFrame>({
+	{kPixelFormatCompression_NTSCDV25,        720,  480, 120'000, kPixelAspectRatio_DVNTSC, kPixelAspectRatio_DVNTSCWide},
+	{kPixelFormatCompression_PALDV25,         720,  576, 144'000, kPixelAspectRatio_DVPAL,  kPixelAspectRatio_DVPALWide},
+	{kPixelFormatCompression_NTSCDV50,        720,  480, 240'000, kPixelAspectRatio_DVNTSC, kPixelAspectRatio_DVNTSCWide},
+	{kPixelFormatCompression_PALDV50,         720,  576, 288'000, kPixelAspectRatio_DVPAL,  kPixelAspectRatio_DVPALWide},
+	{kPixelFormatCompression_NTSCDV100_720p,  960,  720, 240'000, kPixelAspectRatio_Square},
+	{kPixelFormatCompression_PALDV100_720p,   960,  720, 288'000, kPixelAspectRatio_Square},
+	{kPixelFormatCompression_NTSCDV100_1080i, 1280, 1080, 480'000, kPixelAspectRatio_DVCProHD},
+	{kPixelFormatCompression_PALDV100_1080i,  1440, 1080, 576'000, kPixelAspectRatio_HDAnamorphic1080},
 });
+// clang-format on
 
 // Rows by compression code, one for each that the field has room for; empty where a code is not DV.
-constexpr auto sDVSizesByCompression = []
+constexpr auto sDVFramesByCompression = []
 {
-	std::array<DVSize, 16> sizes{};
-	for (const DVSize& size : sDVSizes)
-		sizes.at(static_cast<std::size_t>(size.mCompression)) = size;
-	return sizes;
+	std::array<DVFrame, 16> frames{};
+	for (const DVFrame& frame : sDVFrames)
+		frames.at(static_cast<std::size_t>(frame.mCompression)) = frame;
+	return frames;
 }();
 
-constexpr const DVSize& DVSizeOf(PixelFormatProperties inProperties)
+constexpr const DVFrame& DVFrameOf(PixelFormatProperties inProperties)
 {
-	return sDVSizesByCompression[inProperties.Compression()];
-}
-
-bool IsDVShape(unsigned inCompression, PixelAspectRatio inRatio)
-{
-	switch (inCompression)
-	{
-	case kPixelFormatCompression_NTSCDV25:
-	case kPixelFormatCompression_NTSCDV50:
-		return inRatio == kPixelAspectRatio_DVNTSC || inRatio == kPixelAspectRatio_DVNTSCWide;
-	case kPixelFormatCompression_PALDV25:
-	case kPixelFormatCompression_PALDV50:
-		return inRatio == kPixelAspectRatio_DVPAL || inRatio == kPixelAspectRatio_DVPALWide;
-	case kPixelFormatCompression_NTSCDV100_720p:
-	case kPixelFormatCompression_PALDV100_720p:
-		return inRatio == kPixelAspectRatio_Square;
-	case kPixelFormatCompression_NTSCDV100_1080i:
-		return inRatio == kPixelAspectRatio_DVCProHD;
-	case kPixelFormatCompression_PALDV100_1080i:
-		return inRatio == kPixelAspectRatio_HDAnamorphic1080;
-	}
-	return true;
+	return sDVFramesByCompression[inProperties.Compression()];
 }
 
 // ---- Rows ------------------------------------------------------------------------------------------------------------
@@ -150,7 +133,7 @@ std::int64_t PixelFormatSize(PixelFormat inFormat, int inWidth, int inHeight) no
 {
 	const PixelFormatProperties properties = inFormat.mProperties;
 	if (properties.IsDV())
-		return DVSizeOf(properties).mFrameBytes;
+		return DVFrameOf(properties).mBytes;
 	if (properties.IsMPEG() && properties.IsYUV() && properties.Subsampling() == kPixelFormatSubsampling_420)
 		return Planar420Bytes(inWidth, inHeight);
 	if (properties.IsConcrete() && !properties.IsCompressed())
@@ -167,16 +150,17 @@ void FixedSizedFormatDimensions(PixelFormat inFormat, int& outWidth, int& outHei
 {
 	if (!inFormat.mProperties.IsDV())
 		return;
-	outWidth = DVSizeOf(inFormat.mProperties).mWidth;
-	outHeight = DVSizeOf(inFormat.mProperties).mHeight;
+	outWidth = DVFrameOf(inFormat.mProperties).mWidth;
+	outHeight = DVFrameOf(inFormat.mProperties).mHeight;
 }
 
 bool IsRectValidForFormat(PixelFormat inFormat, int inWidth, int inHeight, PixelAspectRatio inRatio) noexcept
 {
 	if (!inFormat.mProperties.IsDV())
 		return true;
-	const DVSize& size = DVSizeOf(inFormat.mProperties);
-	return inWidth == size.mWidth && inHeight == size.mHeight && IsDVShape(inFormat.mProperties.Compression(), inRatio);
+	const DVFrame& frame = DVFrameOf(inFormat.mProperties);
+	return inWidth == frame.mWidth && inHeight == frame.mHeight
+		&& (inRatio == frame.mShape || inRatio == frame.mWideShape);
 }
 
 }   // namespace zonmediatypes
