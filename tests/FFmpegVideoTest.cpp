@@ -25,48 +25,22 @@ namespace
 
 // ---- Streams by their parameters -------------------------------------------------------------------------------------
 
-TEST(FFmpegPixelFormat, GoesByCodecFieldsMatrixAndRange)
+struct StreamCase
 {
-	constexpr auto kRaw = AV_CODEC_ID_RAWVIDEO;
-	constexpr auto kMPEG2 = AV_CODEC_ID_MPEG2VIDEO;
-	constexpr auto kMPEG4 = AV_CODEC_ID_MPEG4;
-	const struct
-	{
-		AVCodecID mCodec;
-		AVPixelFormat mFormat;
-		AVColorSpace mSpace;
-		AVColorRange mRange;
-		const char* mName;
-		AVFieldOrder mOrder = AV_FIELD_UNKNOWN;
-		int mHeight = 576;
-	} cases[] = {
-		{kRaw, AV_PIX_FMT_UYVY422, AVCOL_SPC_SMPTE170M, AVCOL_RANGE_MPEG, "UYVY_422_8u"},
-		{kRaw, AV_PIX_FMT_UYVY422, AVCOL_SPC_BT709, {}, "UYVY_422_8u_709"},
-		{kRaw, AV_PIX_FMT_UYVY422, AVCOL_SPC_BT709, AVCOL_RANGE_JPEG, ""},
-		{kRaw, AV_PIX_FMT_UYVY422, AVCOL_SPC_BT2020_NCL, {}, ""},
-		{kRaw, AV_PIX_FMT_YUYV422, AVCOL_SPC_BT470BG, {}, "YUYV_422_8u", {}, 1080},
-		{kRaw, AV_PIX_FMT_YUYV422, AVCOL_SPC_UNSPECIFIED, {}, "YUYV_422_8u", {}, 576},
-		{kRaw, AV_PIX_FMT_YUYV422, AVCOL_SPC_UNSPECIFIED, {}, "YUYV_422_8u_709", {}, 577},
-		{kRaw, AV_PIX_FMT_BGRA, AVCOL_SPC_BT709, {}, "BGRA_4444_8u"},   // RGB has no matrix
-		{kRaw, AV_PIX_FMT_BGRA, AVCOL_SPC_RGB, AVCOL_RANGE_MPEG, ""},
-		{kRaw, AV_PIX_FMT_RGBA, AVCOL_SPC_RGB, {}, ""},
-		{kRaw, AV_PIX_FMT_YUV420P, AVCOL_SPC_BT709, {}, ""},   // planar, and not of MPEG
-		{AV_CODEC_ID_V210, AV_PIX_FMT_YUV422P10, AVCOL_SPC_BT709, {}, "V210_422_10u_709"},
-		{kMPEG2, AV_PIX_FMT_YUV420P, AVCOL_SPC_BT709, AVCOL_RANGE_MPEG, "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_709",
-			AV_FIELD_TT},
-		{kMPEG4, AV_PIX_FMT_YUV420P, AVCOL_SPC_SMPTE170M, AVCOL_RANGE_JPEG,
-			"YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_601_FullRange", AV_FIELD_BT},
-		{kMPEG2, AV_PIX_FMT_YUV420P, AVCOL_SPC_BT709, AVCOL_RANGE_JPEG,
-			"YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_709_FullRange", AV_FIELD_PROGRESSIVE},
-		{kMPEG4, AV_PIX_FMT_YUV420P, AVCOL_SPC_UNSPECIFIED, {}, "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601"},
-		{kMPEG2, AV_PIX_FMT_YUV422P, AVCOL_SPC_BT709, {}, ""},
-		{AV_CODEC_ID_H264, AV_PIX_FMT_YUV420P, AVCOL_SPC_BT709, AVCOL_RANGE_MPEG, "", AV_FIELD_PROGRESSIVE},
-		{AV_CODEC_ID_DVVIDEO, AV_PIX_FMT_YUV420P, AVCOL_SPC_UNSPECIFIED, {}, "", {}, 480},
-	};
-	for (const auto& [codec, format, space, range, name, order, height] : cases)
+	AVPixelFormat mFormat;
+	AVColorSpace mSpace;
+	const char* mName;   // as the catalogue has it, empty where nothing corresponds
+	AVColorRange mRange = AVCOL_RANGE_UNSPECIFIED;
+	AVFieldOrder mOrder = AV_FIELD_UNKNOWN;
+	int mHeight = 576;
+};
+
+void ExpectFormats(AVCodecID inCodec, std::initializer_list<StreamCase> inCases)
+{
+	for (const auto& [format, space, name, range, order, height] : inCases)
 	{
 		AVCodecParameters* parameters = avcodec_parameters_alloc();
-		parameters->codec_id = codec;
+		parameters->codec_id = inCodec;
 		parameters->format = format;
 		parameters->width = 720;
 		parameters->height = height;
@@ -77,6 +51,37 @@ TEST(FFmpegPixelFormat, GoesByCodecFieldsMatrixAndRange)
 		avcodec_parameters_free(&parameters);
 		EXPECT_EQ(PixelFormatCatalogueName(found), name) << av_get_pix_fmt_name(format) << ", " << height << " lines";
 	}
+}
+
+TEST(FFmpegPixelFormat, OfRawVideoGoesByMatrixAndRange)
+{
+	constexpr auto kUYVY = AV_PIX_FMT_UYVY422, kYUYV = AV_PIX_FMT_YUYV422;
+	ExpectFormats(AV_CODEC_ID_RAWVIDEO,
+		{{kUYVY, AVCOL_SPC_SMPTE170M, "UYVY_422_8u", AVCOL_RANGE_MPEG}, {kUYVY, AVCOL_SPC_BT709, "UYVY_422_8u_709"},
+			{kUYVY, AVCOL_SPC_BT709, "", AVCOL_RANGE_JPEG}, {kUYVY, AVCOL_SPC_BT2020_NCL, ""},
+			{kYUYV, AVCOL_SPC_BT470BG, "YUYV_422_8u", {}, {}, 1080},
+			{kYUYV, AVCOL_SPC_UNSPECIFIED, "YUYV_422_8u", {}, {}, 576},
+			{kYUYV, AVCOL_SPC_UNSPECIFIED, "YUYV_422_8u_709", {}, {}, 577},
+			{AV_PIX_FMT_BGRA, AVCOL_SPC_BT709, "BGRA_4444_8u"},   // RGB has no matrix
+			{AV_PIX_FMT_BGRA, AVCOL_SPC_RGB, "", AVCOL_RANGE_MPEG}, {AV_PIX_FMT_RGBA, AVCOL_SPC_RGB, ""},
+			{AV_PIX_FMT_YUV420P, AVCOL_SPC_BT709, ""}});   // planar, and not of MPEG
+}
+
+TEST(FFmpegPixelFormat, OfCodecsGoesByFieldsMatrixAndRange)
+{
+	constexpr auto k420 = AV_PIX_FMT_YUV420P;
+	ExpectFormats(AV_CODEC_ID_V210, {{AV_PIX_FMT_YUV422P10, AVCOL_SPC_BT709, "V210_422_10u_709"}});
+	ExpectFormats(AV_CODEC_ID_MPEG2VIDEO,
+		{{k420, AVCOL_SPC_BT709, "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_709", AVCOL_RANGE_MPEG, AV_FIELD_TT},
+			{k420, AVCOL_SPC_BT709, "YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_709_FullRange", AVCOL_RANGE_JPEG,
+				AV_FIELD_PROGRESSIVE},
+			{AV_PIX_FMT_YUV422P, AVCOL_SPC_BT709, ""}});
+	ExpectFormats(AV_CODEC_ID_MPEG4,
+		{{k420, AVCOL_SPC_SMPTE170M, "YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_601_FullRange", AVCOL_RANGE_JPEG,
+			 AV_FIELD_BT},
+			{k420, AVCOL_SPC_UNSPECIFIED, "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601"}});
+	ExpectFormats(AV_CODEC_ID_H264, {{k420, AVCOL_SPC_BT709, "", AVCOL_RANGE_MPEG, AV_FIELD_PROGRESSIVE}});
+	ExpectFormats(AV_CODEC_ID_DVVIDEO, {{k420, AVCOL_SPC_UNSPECIFIED, "", {}, {}, 480}});
 }
 
 TEST(FFmpegVideo, FieldsAndShapesGoBothWays)
@@ -127,39 +132,31 @@ VideoFile Probe(const std::string& inPath)
 struct FileCase
 {
 	const char* mName;
-	const char* mFormat;      // as the catalogue names it
-	bool mIsFrameOfOurSize;   // its first packet is as long as our frame
-	const char* mShape;       // the description of its pixels
+	const char* mFormat;                          // as the catalogue names it
+	const char* mShape = "Square Pixels (1.0)";   // the description of its pixels
 };
 
-const FileCase kFiles[] = {
-	{"dv25-ntsc.dv", "NTSCDV25", true, "Other Aspect Ratio (0.8889)"},
-	{"dv25-ntsc-wide.dv", "NTSCDV25", true, "Other Aspect Ratio (1.1852)"},
-	{"dv25-pal.dv", "PALDV25", true, "Other Aspect Ratio (1.0667)"},
-	{"dv25-pal-dvcpro.mov", "PALDV25", true, "Square Pixels (1.0)"},
-	{"dv50-ntsc.dv", "NTSCDV50", true, "Other Aspect Ratio (0.8889)"},
-	{"dv50-pal.dv", "PALDV50", true, "Other Aspect Ratio (1.0667)"},
-	{"dv100-720p60.mov", "NTSC_DV100_720p", true, "Square Pixels (1.0)"},
-	{"dv100-720p50.mov", "PAL_DV100_720p", true, "Square Pixels (1.0)"},
-	{"dv100-1080i60.mov", "NTSC_DV100_1080i", true, "Square Pixels (1.0)"},
-	{"dv100-1080i50.mov", "PAL_DV100_1080i", true, "Square Pixels (1.0)"},
-	{"mpeg2-upper-601.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_601", false, "Other Aspect Ratio (0.8889)"},
-	{"mpeg2-lower.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_601", false, "Other Aspect Ratio (1.0667)"},
-	{"mpeg2-upper-709.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_709", false, "HD Anamorphic 1080 (1.3333)"},
-	{"mpeg2-progressive.m2v", "YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_709", false, "Square Pixels (1.0)"},
-	{"mpeg4-12-11.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", false, "Other Aspect Ratio (1.0909)"},
-	{"mpeg4-10-11.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", false, "D1/DV NTSC (0.9091)"},
-	{"mpeg4-40-33.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", false, "D1/DV NTSC Widescreen 16:9 (1.2121)"},
-	{"uyvy.mov", "UYVY_422_8u", true, "Square Pixels (1.0)"},
-	{"yuyv.mov", "YUYV_422_8u", true, "Square Pixels (1.0)"},
-	{"bgra.avi", "BGRA_4444_8u", true, "Square Pixels (1.0)"},
-	{"bgr0.nut", "BGRX_4444_8u", true, "Square Pixels (1.0)"},
-	{"argb.mov", "ARGB_4444_8u", true, "Square Pixels (1.0)"},
-	{"0rgb.nut", "XRGB_4444_8u", true, "Square Pixels (1.0)"},
-	{"v210.mov", "V210_422_10u", true, "Square Pixels (1.0)"},
-	{"r210.mov", "RGB_444_10u", false, "Square Pixels (1.0)"},   // its encoder pads rows to 256 bytes, we to 64
-	{"rgb24.mov", "", false, "Square Pixels (1.0)"},
-};
+// Their first packet is as long as our frame.
+const FileCase kFilesOfFrames[] = {{"dv25-ntsc.dv", "NTSCDV25", "Other Aspect Ratio (0.8889)"},
+	{"dv25-ntsc-wide.dv", "NTSCDV25", "Other Aspect Ratio (1.1852)"},
+	{"dv25-pal.dv", "PALDV25", "Other Aspect Ratio (1.0667)"}, {"dv25-pal-dvcpro.mov", "PALDV25"},
+	{"dv50-ntsc.dv", "NTSCDV50", "Other Aspect Ratio (0.8889)"},
+	{"dv50-pal.dv", "PALDV50", "Other Aspect Ratio (1.0667)"}, {"dv100-720p60.mov", "NTSC_DV100_720p"},
+	{"dv100-720p50.mov", "PAL_DV100_720p"}, {"dv100-1080i60.mov", "NTSC_DV100_1080i"},
+	{"dv100-1080i50.mov", "PAL_DV100_1080i"}, {"uyvy.mov", "UYVY_422_8u"}, {"yuyv.mov", "YUYV_422_8u"},
+	{"bgra.avi", "BGRA_4444_8u"}, {"bgr0.nut", "BGRX_4444_8u"}, {"argb.mov", "ARGB_4444_8u"},
+	{"0rgb.nut", "XRGB_4444_8u"}, {"v210.mov", "V210_422_10u"}};
+
+// Compressed by more than DV; r210's encoder pads rows to 256 bytes, we to 64; and what has no counterpart.
+const FileCase kOtherFiles[]
+	= {{"mpeg2-upper-601.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_601", "Other Aspect Ratio (0.8889)"},
+		{"mpeg2-lower.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_601", "Other Aspect Ratio (1.0667)"},
+		{"mpeg2-upper-709.m2v", "YUV_420_MPEG2_FIELD_PICTURE_PLANAR_8u_709", "HD Anamorphic 1080 (1.3333)"},
+		{"mpeg2-progressive.m2v", "YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_709"},
+		{"mpeg4-12-11.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", "Other Aspect Ratio (1.0909)"},
+		{"mpeg4-10-11.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", "D1/DV NTSC (0.9091)"},
+		{"mpeg4-40-33.mp4", "YUV_420_MPEG4_FRAME_PICTURE_PLANAR_8u_601", "D1/DV NTSC Widescreen 16:9 (1.2121)"},
+		{"r210.mov", "RGB_444_10u"}, {"rgb24.mov", ""}};
 
 TEST(FFmpegFiles, AreWhatTheCatalogueSays)
 {
@@ -167,19 +164,22 @@ TEST(FFmpegFiles, AreWhatTheCatalogueSays)
 		GTEST_SKIP() << "ffmpeg makes the files of this test, and it is not installed";
 	const std::filesystem::path folder = std::filesystem::path(testing::TempDir()) / "zonmediatypes-video-files";
 	ASSERT_EQ(std::system(("sh '" ZON_TEST_DATA "/make-video.sh' '" + folder.string() + "'").c_str()), 0);
-	for (const auto& [name, formatName, isFrameOfOurSize, shape] : kFiles)
+	const auto expect = [&](const FileCase& inCase, bool inIsFrameOfOurs)
 	{
-		SCOPED_TRACE(name);
-		const VideoFile file = Probe((folder / name).string());
-		EXPECT_EQ(PixelFormatCatalogueName(file.mFormat), formatName);
-		EXPECT_EQ(zoncore::utility::UTF16to8(PixelAspectRatioDescription(file.mShape)), shape);
-		EXPECT_TRUE(
-			!isFrameOfOurSize || PixelFormatSize(file.mFormat, file.mWidth, file.mHeight) == file.mFirstFrameBytes);
+		SCOPED_TRACE(inCase.mName);
+		const VideoFile file = Probe((folder / inCase.mName).string());
+		EXPECT_EQ(PixelFormatCatalogueName(file.mFormat), inCase.mFormat);
+		EXPECT_EQ(zoncore::utility::UTF16to8(PixelAspectRatioDescription(file.mShape)), inCase.mShape);
+		EXPECT_EQ(PixelFormatSize(file.mFormat, file.mWidth, file.mHeight) == file.mFirstFrameBytes, inIsFrameOfOurs);
 		int width = file.mWidth;
 		int height = file.mHeight;
 		FixedSizedFormatDimensions(file.mFormat, width, height);
 		EXPECT_EQ(std::pair(width, height), std::pair(file.mWidth, file.mHeight));
-	}
+	};
+	for (const FileCase& file : kFilesOfFrames)
+		expect(file, true);
+	for (const FileCase& file : kOtherFiles)
+		expect(file, false);
 	std::filesystem::remove_all(folder);
 }
 

@@ -65,13 +65,9 @@ TEST(PixelAspectRatio, ComparesWithToleranceAndZeros)
 	{
 		for (const auto& [r, right] : ranked)
 		{
-			SCOPED_TRACE(testing::Message() << l << ", " << r);
-			EXPECT_EQ(l == r, left == right);
-			EXPECT_EQ(l != r, left != right);
-			EXPECT_EQ(l < r, left < right);
-			EXPECT_EQ(l > r, left > right);
-			EXPECT_EQ(l <= r, left <= right);
-			EXPECT_EQ(l >= r, left >= right);
+			EXPECT_TRUE((l == r) == (left == right) && (l != r) == (left != right)) << l << ", " << r;
+			EXPECT_TRUE((l < r) == (left < right) && (l > r) == (left > right)) << l << ", " << r;
+			EXPECT_TRUE((l <= r) == (left <= right) && (l >= r) == (left >= right)) << l << ", " << r;
 		}
 	}
 	EXPECT_EQ(Ratio(1'000, 1'001), Ratio(1, 1)) << "and 999/1000, which 1/1 is not";
@@ -84,18 +80,9 @@ TEST(PixelAspectRatio, ComparesWithToleranceAndZeros)
 
 TEST(PixelAspectRatio, WritesOneDecimalOrFour)
 {
-	const std::pair<Ratio, const char*> cases[] = {
-		{{1, 1}, "1.0"},
-		{{1'000, 1'001}, "1.0"},
-		{{999, 1'000}, "0.9990"},
-		{{3, 2}, "1.5"},
-		{{4, 2}, "2.0"},
-		{{10, 11}, "0.9091"},
-		{{768, 702}, "1.0940"},
-		{{0, 1}, "0.0000"},
-		{{0, 0}, "1.79769e+308"},
-		{{kMost, 1}, "4294967295.0000"},
-	};
+	const std::pair<Ratio, const char*> cases[] = {{{1, 1}, "1.0"}, {{1'000, 1'001}, "1.0"}, {{999, 1'000}, "0.9990"},
+		{{3, 2}, "1.5"}, {{4, 2}, "2.0"}, {{10, 11}, "0.9091"}, {{768, 702}, "1.0940"}, {{0, 1}, "0.0000"},
+		{{0, 0}, "1.79769e+308"}, {{kMost, 1}, "4294967295.0000"}};
 	for (const auto& [ratio, text] : cases)
 	{
 		EXPECT_EQ(UTF16to8(ratio.GetDisplayString()), text);
@@ -132,12 +119,11 @@ TEST(PixelAspectRatioUtils, ConvertWidthsOnly)
 	};
 	for (const auto& [width, ratio, toSquare, fromSquare] : cases)
 	{
-		using Rect = RectT<int>;
-		using Point = PointT<int>;
-		EXPECT_EQ(AdjustPixelAspectRectToSquarePixelRect({1, 2, width, 4}, ratio), (Rect{1, 2, toSquare, 4}));
-		EXPECT_EQ(AdjustSquarePixelRectToPixelAspectRect({1, 2, width, 4}, ratio), (Rect{1, 2, fromSquare, 4}));
-		EXPECT_EQ(AdjustPixelAspectDimensionToSquarePixelDimension({width, 5}, ratio), (Point{toSquare, 5}));
-		EXPECT_EQ(AdjustSquarePixelDimensionToPixelAspectDimension({width, 5}, ratio), (Point{fromSquare, 5}));
+		const RectT<int> rect{1, 2, width, 4};
+		EXPECT_EQ(AdjustPixelAspectRectToSquarePixelRect(rect, ratio), (RectT<int>{1, 2, toSquare, 4}));
+		EXPECT_EQ(AdjustSquarePixelRectToPixelAspectRect(rect, ratio), (RectT<int>{1, 2, fromSquare, 4}));
+		EXPECT_EQ(AdjustPixelAspectDimensionToSquarePixelDimension({width, 5}, ratio), (PointT<int>{toSquare, 5}));
+		EXPECT_EQ(AdjustSquarePixelDimensionToPixelAspectDimension({width, 5}, ratio), (PointT<int>{fromSquare, 5}));
 	}
 }
 

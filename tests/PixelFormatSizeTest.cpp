@@ -64,52 +64,50 @@ TEST(PixelFormatSize, IsWhatTheNamesOfTheFormatsSay)
 	}
 }
 
-// Fields that no format of the catalogue combines, and sizes that no picture has.
-TEST(PixelFormatSize, FollowsTheFieldsAlone)
+using P = PixelFormatProperties;
+const PixelFormat& sBGRA = kPixelFormat_BGRA_4444_8u;
+const PixelFormat& sUYVY = kPixelFormat_UYVY_422_8u;
+const PixelFormat& sV210 = kPixelFormat_V210_422_10u;
+const PixelFormat& sMPEG = kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601;
+
+struct SizeCase
 {
-	using P = PixelFormatProperties;
-	const PixelFormat bgra = kPixelFormat_BGRA_4444_8u;
-	const PixelFormat uyvy = kPixelFormat_UYVY_422_8u;
-	const PixelFormat v210 = kPixelFormat_V210_422_10u;
-	const PixelFormat rgb = kPixelFormat_RGB_444_10u;
-	const PixelFormat mpeg = kPixelFormat_YUV_420_MPEG2_FRAME_PICTURE_PLANAR_8u_601;
-	const struct
-	{
-		PixelFormat mFormat;
-		int mWidth, mHeight;
-		std::int64_t mRowBytes, mSize;
-	} cases[] = {
-		{With(bgra, &P::SetBitDepth, kPixelFormatBitDepth_16), 16, 2, 128, 256},
-		{With(bgra, &P::SetBitDepth, kPixelFormatBitDepth_24), 16, 2, 192, 384},
-		{With(bgra, &P::SetBitDepth, kPixelFormatBitDepth_10), 64, 2, 320, 640},
-		{With(bgra, &P::SetBitDepth, 6), 16, 2, 0, 0},
-		{With(bgra, &P::SetBitDepth, 7), 16, 2, 0, 0},
-		{With(bgra, &P::SetAlpha, kPixelFormatAlpha_None), 64, 2, 192, 384},
-		{With(bgra, &P::SetSubsampling, kPixelFormatSubsampling_420), 16, 2, 0, 0},
-		{With(rgb, &P::SetSubsampling, kPixelFormatSubsampling_420), 16, 2, 64, 128},
-		{With(v210, &P::SetIsFloat, 1), 48, 2, 0, 0},
-		{With(v210, &P::SetIsYUV, 0), 48, 2, 0, 0},
-		{With(uyvy, &P::SetIsYUV, 0), 16, 2, 32, 64},
-		{With(uyvy, &P::SetCompression, 13), 16, 2, 32, 0},   // rows, and no size
-		{With(mpeg, &P::SetIsYUV, 0), 128, 32, 0, 0},
-		{With(mpeg, &P::SetSubsampling, kPixelFormatSubsampling_444), 128, 32, 0, 0},
-		{With(mpeg, &P::SetKind, kPixelFormatKind_Any), 128, 32, 0, 8'192},
-		{With(kPixelFormat_NTSCDV25, &P::SetKind, kPixelFormatKind_Invalid), 1, 1, 0, 120'000},
-		{bgra, 16, -2, 64, -128},   // nothing is rejected
-		{bgra, -1, 2, 0, 0},
-		{bgra, kMost, 2, 0, 0},
-		{uyvy, -kMost, 1, 16, 16},
-		{v210, -7, 1, 0, 0},
-		{v210, -17, 1, 0, 0},
-		{v210, kMost, 1, 128, 128},
-		{mpeg, kMost, kMost, 0, 1ll << 61},
-	};
-	for (const auto& [format, width, height, row, size] : cases)
+	PixelFormat mFormat;
+	int mWidth, mHeight;
+	std::int64_t mRowBytes, mSize;
+};
+
+void ExpectSizes(std::initializer_list<SizeCase> inCases)
+{
+	for (const auto& [format, width, height, row, size] : inCases)
 	{
 		SCOPED_TRACE(testing::Message() << std::hex << format.mProperties.GetValue() << std::dec << ", " << width);
 		EXPECT_EQ(UncompressedPixelFormatRowBytes(format, width), row);
 		EXPECT_EQ(PixelFormatSize(format, width, height), size);
 	}
+}
+
+TEST(PixelFormatSize, FollowsFieldsThatNoFormatCombines)
+{
+	const auto bgraOf = [](PixelFormatBitDepth inDepth) { return With(sBGRA, &P::SetBitDepth, inDepth); };
+	ExpectSizes({{bgraOf(kPixelFormatBitDepth_16), 16, 2, 128, 256}, {bgraOf(kPixelFormatBitDepth_24), 16, 2, 192, 384},
+		{bgraOf(kPixelFormatBitDepth_10), 64, 2, 320, 640}, {With(sBGRA, &P::SetBitDepth, 6), 16, 2, 0, 0},
+		{With(sBGRA, &P::SetBitDepth, 7), 16, 2, 0, 0},
+		{With(sBGRA, &P::SetAlpha, kPixelFormatAlpha_None), 64, 2, 192, 384},
+		{With(sBGRA, &P::SetSubsampling, kPixelFormatSubsampling_420), 16, 2, 0, 0},
+		{With(kPixelFormat_RGB_444_10u, &P::SetSubsampling, kPixelFormatSubsampling_420), 16, 2, 64, 128},
+		{With(sV210, &P::SetIsFloat, 1), 48, 2, 0, 0}, {With(sV210, &P::SetIsYUV, 0), 48, 2, 0, 0},
+		{With(sUYVY, &P::SetIsYUV, 0), 16, 2, 32, 64}, {With(sUYVY, &P::SetCompression, 13), 16, 2, 32, 0},
+		{With(sMPEG, &P::SetIsYUV, 0), 128, 32, 0, 0},
+		{With(sMPEG, &P::SetSubsampling, kPixelFormatSubsampling_444), 128, 32, 0, 0},
+		{With(sMPEG, &P::SetKind, kPixelFormatKind_Any), 128, 32, 0, 8'192},
+		{With(kPixelFormat_NTSCDV25, &P::SetKind, kPixelFormatKind_Invalid), 1, 1, 0, 120'000}});
+}
+
+TEST(PixelFormatSize, RejectsNoWidthAndWraps)
+{
+	ExpectSizes({{sBGRA, 16, -2, 64, -128}, {sBGRA, -1, 2, 0, 0}, {sBGRA, kMost, 2, 0, 0}, {sUYVY, -kMost, 1, 16, 16},
+		{sV210, -7, 1, 0, 0}, {sV210, -17, 1, 0, 0}, {sV210, kMost, 1, 128, 128}, {sMPEG, kMost, kMost, 0, 1ll << 61}});
 }
 
 // ---- DV --------------------------------------------------------------------------------------------------------------
