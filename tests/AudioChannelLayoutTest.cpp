@@ -5,9 +5,10 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <fstream>
 #include <limits>
+#include <sstream>
 #include <string>
-#include <utility>
 #include <vector>
 
 namespace
@@ -17,15 +18,11 @@ using namespace zonmediatypes;
 
 // ---- Labels and their partners ---------------------------------------------------------------------------------------
 
-TEST(AudioChannelLabel, HasTheRequiredNumbers)
+TEST(AudioChannelLabel, HasTheRequiredNumbersAndIsOrderedByThem)
 {
 	EXPECT_TRUE(std::ranges::equal(AllAudioChannelLabels(), kRequiredLabels, {}, {}, &RequiredLabel::mLabel));
 	for (const RequiredLabel& label : kRequiredLabels)
 		EXPECT_EQ(label.mLabel, label.mValue) << label.mName;
-}
-
-TEST(AudioChannelDescription, ComparesBySignedNumber)
-{
 	EXPECT_EQ(AudioChannelDescription(), kAudioChannelLabel_Discrete);
 	EXPECT_LT(AudioChannelDescription(static_cast<AudioChannelLabel>(-1)), AudioChannelDescription());
 	EXPECT_LT(AudioChannelDescription(), AudioChannelDescription(kAudioChannelLabel_FrontLeft));
@@ -56,52 +53,50 @@ TEST(LabelPairs, AreTheRequiredOnes)
 
 struct RequiredLayout
 {
-	std::string_view mName;
+	std::string mFactory;
 	AudioChannelLayout (*mCreate)();
 	std::string mLabels;
 };
 
 // The layouts that are called after what they are for; the names of the others are their labels: "_L_R_C_".
 // clang-format off
-#define NAMED(inName, inLabels) {#inName, Create##inName##ChannelLayout, inLabels}
-#define OTHER(inName, inLabels) {#inName, Create##inName, inLabels}
+#define ROW(inFactory, inLabels) {#inFactory, inFactory, inLabels}
 const std::vector<RequiredLayout> sRequiredLayouts = {
-	NAMED(Mono, "*"),
-	NAMED(Stereo, "L R"),
-	NAMED(51, "L R C LFE Ls Rs"),
-	NAMED(Broadcast51, "L R C LFE Ls Rs"),
-	NAMED(Legacy51, "L R Ls Rs C LFE"),
-	NAMED(Quadraphonic, "L R Ls Rs"),
-	NAMED(7_1Itu, "L R C LFE Ls Rs Rls Rrs"),
-	NAMED(MatrixStereo, "Lt Rt"),
-	NAMED(AmbisonicsBFormat, "W X Y Z"),
-	NAMED(Pentagonal, "L R Ls Rs C"),
-	NAMED(Hexagonal, "L R Ls Rs C Cs"),
-	NAMED(7_1, "L R C LFE Ls Rs Lc Rc"),
-	NAMED(7_1Mpeg, "C Lc Rc L R Ls Rs LFE"),
-	NAMED(7_1EMagic, "L R Ls Rs C LFE Lc Rc"),
-	NAMED(SmpteDtv, "L R C LFE Ls Rs Lt Rt"),
-	NAMED(Octagonal, "L R Ls Rs C Cs Lsd Rsd"),
-	NAMED(Cube, "L R Ls Rs Vhl Vhr Tbl Tbr"),
-	NAMED(VST10_2, "L R C LFE Ls Rs Vhl Vhc Vhr Tbl Tbr LFE2"),
-	NAMED(_L_R_C_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_, "L R C Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
-	NAMED(VST10_2_Plus, "L R C LFE Ls Rs Lc Rc Vhl Vhc Vhr Tbl Tbr LFE2"),
-	NAMED(_L_R_C_LFE_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_, "L R C LFE Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
-	NAMED(VST22_2, "L R C LFE Ls Rs Lc Rc Cs Lsd Rsd Ts Vhl Vhc Vhr Tbl Tbc Tbr LFE2 Tsl Tsr Bfl Bfc Bfr"),
-	OTHER(_VST_7_1_Cine_Top_Center_Layout, "L R C LFE Ls Rs Cs Ts"),
-	OTHER(_VST_7_1_Cine_Center_High_Layout, "L R C LFE Ls Rs Cs Vhc"),
-	OTHER(_VST_7_1_Cine_Front_High_Layout, "L R C LFE Ls Rs Vhl Vhr"),
-	OTHER(_VST_7_1_Cine_Side_High_Layout, "L R C LFE Ls Rs Tsl Tsr"),
-	OTHER(SMPTEDigitalCinema1Channel, "* * C * * * * * * * * * * * * *"),
-	OTHER(SMPTEDigitalCinema2Channel, "Lt Rt * * * * * * * * * * * * * *"),
-	OTHER(SMPTEDigitalCinema4Channel, "L R C * Cs * * * * * * * * * * *"),
-	OTHER(SMPTEDigitalCinema6Channel, "L R C LFE Ls Rs * * * * * * * * * *"),
-	OTHER(SMPTEDigitalCinema7Channel, "L R C LFE Ls Rs * * Cs * * * * * * *"),
-	OTHER(SMPTEDigitalCinema8Channel, "L R C LFE Ls Rs Lc Rc * * * * * * * *"),
-	OTHER(SMPTEDigitalCinema9Channel, "L R C LFE Ls Rs Lc Rc Cs * * * * * * *"),
+	ROW(CreateMonoChannelLayout, "*"),
+	ROW(CreateStereoChannelLayout, "L R"),
+	ROW(Create51ChannelLayout, "L R C LFE Ls Rs"),
+	ROW(CreateBroadcast51ChannelLayout, "L R C LFE Ls Rs"),
+	ROW(CreateLegacy51ChannelLayout, "L R Ls Rs C LFE"),
+	ROW(CreateQuadraphonicChannelLayout, "L R Ls Rs"),
+	ROW(Create7_1ItuChannelLayout, "L R C LFE Ls Rs Rls Rrs"),
+	ROW(CreateMatrixStereoChannelLayout, "Lt Rt"),
+	ROW(CreateAmbisonicsBFormatChannelLayout, "W X Y Z"),
+	ROW(CreatePentagonalChannelLayout, "L R Ls Rs C"),
+	ROW(CreateHexagonalChannelLayout, "L R Ls Rs C Cs"),
+	ROW(Create7_1ChannelLayout, "L R C LFE Ls Rs Lc Rc"),
+	ROW(Create7_1MpegChannelLayout, "C Lc Rc L R Ls Rs LFE"),
+	ROW(Create7_1EMagicChannelLayout, "L R Ls Rs C LFE Lc Rc"),
+	ROW(CreateSmpteDtvChannelLayout, "L R C LFE Ls Rs Lt Rt"),
+	ROW(CreateOctagonalChannelLayout, "L R Ls Rs C Cs Lsd Rsd"),
+	ROW(CreateCubeChannelLayout, "L R Ls Rs Vhl Vhr Tbl Tbr"),
+	ROW(CreateVST10_2ChannelLayout, "L R C LFE Ls Rs Vhl Vhc Vhr Tbl Tbr LFE2"),
+	ROW(Create_L_R_C_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
+	ROW(CreateVST10_2_PlusChannelLayout, "L R C LFE Ls Rs Lc Rc Vhl Vhc Vhr Tbl Tbr LFE2"),
+	ROW(Create_L_R_C_LFE_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C LFE Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
+	ROW(CreateVST22_2ChannelLayout, "L R C LFE Ls Rs Lc Rc Cs Lsd Rsd Ts Vhl Vhc Vhr Tbl Tbc Tbr LFE2 Tsl Tsr Bfl Bfc Bfr"),
+	ROW(Create_VST_7_1_Cine_Top_Center_Layout, "L R C LFE Ls Rs Cs Ts"),
+	ROW(Create_VST_7_1_Cine_Center_High_Layout, "L R C LFE Ls Rs Cs Vhc"),
+	ROW(Create_VST_7_1_Cine_Front_High_Layout, "L R C LFE Ls Rs Vhl Vhr"),
+	ROW(Create_VST_7_1_Cine_Side_High_Layout, "L R C LFE Ls Rs Tsl Tsr"),
+	ROW(CreateSMPTEDigitalCinema1Channel, "* * C * * * * * * * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema2Channel, "Lt Rt * * * * * * * * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema4Channel, "L R C * Cs * * * * * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema6Channel, "L R C LFE Ls Rs * * * * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema7Channel, "L R C LFE Ls Rs * * Cs * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema8Channel, "L R C LFE Ls Rs Lc Rc * * * * * * * *"),
+	ROW(CreateSMPTEDigitalCinema9Channel, "L R C LFE Ls Rs Lc Rc Cs * * * * * * *"),
 };
-#undef NAMED
-#undef OTHER
+#undef ROW
 // clang-format on
 
 TEST(ChannelLayouts, AreTheRequiredOnes)
@@ -109,15 +104,26 @@ TEST(ChannelLayouts, AreTheRequiredOnes)
 	EXPECT_EQ(AllChannelLayouts().size(), 89u);
 	for (const auto& [name, labels] : AllChannelLayouts())
 	{
-		const auto required = std::ranges::find(sRequiredLayouts, name, &RequiredLayout::mName);
+		const auto required = std::ranges::find_if(sRequiredLayouts,
+			[factory = "Create" + std::string(name)](const RequiredLayout& inLayout)
+			{ return inLayout.mFactory == factory || inLayout.mFactory == factory + "ChannelLayout"; });
 		std::string words(name);
 		std::ranges::replace(words, '_', ' ');
 		const AudioChannelLayout layout = ReadLayout(required != sRequiredLayouts.end() ? required->mLabels : words);
 		EXPECT_TRUE(std::ranges::equal(labels, layout)) << name;
 	}
-	for (const RequiredLayout& required : sRequiredLayouts)
-		EXPECT_EQ(required.mCreate(), ReadLayout(required.mLabels)) << required.mName;
 	EXPECT_EQ(Create_L_R_C_LFE_ChannelLayout(), ReadLayout("L R C LFE"));
+	std::ostringstream header;
+	header << std::ifstream(ZON_TEST_DATA "/../../zonmediatypes/AudioChannelLayoutCatalogue.h").rdbuf();
+	for (const auto& [factory, create, labels] : sRequiredLayouts)
+	{
+		EXPECT_EQ(create(), ReadLayout(labels)) << factory;
+		// The declaration with the line before it, and its comment in one of them.
+		const std::size_t place = header.str().find("_API AudioChannelLayout " + factory + "();");
+		const std::size_t begin = header.str().rfind('\n', header.str().rfind('\n', place) - 1);
+		const std::string lines = header.str().substr(begin, header.str().find('\n', place) - begin);
+		EXPECT_TRUE(lines.ends_with("///< " + labels) || lines.starts_with("\n/// " + labels + "\n")) << lines;
+	}
 }
 
 TEST(ChannelLayouts, OfAnyCount)
@@ -154,7 +160,7 @@ TEST(LayoutQueries, CompareChannelsInAnyOrder)
 	const auto areSame = [](const char* inFirst, const char* inSecond)
 	{ return ContainsSameChannelsIgnoreOrder(ReadLayout(inFirst), ReadLayout(inSecond)); };
 	EXPECT_TRUE(areSame("", ""));
-	EXPECT_TRUE(areSame("* L * -1", "-1 * * L"));
+	EXPECT_TRUE(areSame("* L * -1", "L * -1 *"));
 	EXPECT_FALSE(areSame("L R", "L R R"));
 	EXPECT_FALSE(areSame("L L R", "L R R"));
 }

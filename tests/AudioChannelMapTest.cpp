@@ -121,14 +121,14 @@ TEST(ChannelMap, MovesALabel)
 	};
 	for (const auto& [before, label, channel, after] : std::initializer_list<Case>{
 			 {"0:L|1:R", "L", 1, "1:R L"},
-			 {"0:L|1:R", "L", 0, "1:R|0:L"},       // emptied and made anew
-			 {"0:L R|1:C", "L", 0, "0:R L|1:C"},   // last of its entry
+			 {"0:L|1:R", "L", 0, "1:R|0:L"},
+			 {"0:L R|1:C", "L", 0, "0:R L|1:C"},
 			 {"0:L|1:R", "L", -1, "1:R"},
 			 {"0:L|1:R", "C", -1, "0:L|1:R"},
 			 {"0:L|1:R", "C", 5, "0:L|1:R|5:C"},
 			 {"", "C", 0, "0:C"},
-			 {"0:L L|1:L", "L", 1, "0:L|1:L"},   // one occurrence goes, and the target has it
 			 {"-1:L|1:R", "L", 1, "1:R L"},
+			 {"0:L L|1:L", "L", 1, "0:L|1:L"},         // one occurrence goes, and the target has it
 			 {"0:L|0:R|1:C", "R", 2, "0:L|1:C|2:R"},   // the first assignment to 0 goes: equal values
 			 {"0:L|7:C|0:R", "R", -1, "7:L|0:C"},      // the same, while the labels of the second go
 			 {"0:|1:L|2:R", "L", 3, "0:|2:R|3:L"},     // the empty entry that goes is not the one emptied

@@ -128,17 +128,11 @@ TEST(ChannelOrdering, FindsTheSourceOfEachChannel)
 		ChannelOrdering mOrdering;
 	};
 	const ChannelOrdering untouched = {42};
-	for (const auto& [source, destination, found, expected] : std::initializer_list<Case>{
-			 {"L R C LFE Ls Rs", "L R Ls Rs C LFE", true, {0, 1, 4, 5, 2, 3}},
-			 {"L R", "", true, {}},
-			 {"", "L", false, untouched},
-			 {"L R C", "L R", false, untouched},
-			 {"L R", "L C", false, untouched},
-			 {"L R R", "R R L", true, {1, 1, 0}},   // no permutation
-			 {"* L *", "L * *", true, {1, 0, 2}},
-			 {"* L R", "* * L", false, untouched},
-			 {"5 -1", "-1 5", true, {1, 0}},
-		 })
+	for (const auto& [source, destination, found, expected] :
+		std::initializer_list<Case>{{"L R C LFE Ls Rs", "L R Ls Rs C LFE", true, {0, 1, 4, 5, 2, 3}},
+			{"L R", "", true, {}}, {"", "L", false, untouched}, {"L R C", "L R", false, untouched},
+			{"L R", "L C", false, untouched}, {"L R R", "R R L", true, {1, 1, 0}},   // no permutation
+			{"* L *", "L * *", true, {1, 0, 2}}, {"* L R", "* * L", false, untouched}, {"5 -1", "-1 5", true, {1, 0}}})
 	{
 		ChannelOrdering ordering = untouched;
 		EXPECT_EQ(RemapChannelOrdering(ReadLayout(source), ReadLayout(destination), ordering), found);
@@ -156,19 +150,11 @@ TEST(ReplaceDiscreteLabels, GivesEachMissingLabelOnce)
 		bool mHasChanged;
 		const char* mResult;
 	};
-	for (const auto& [source, destination, hasChanged, result] : std::initializer_list<Case>{
-			 {"L * *", "L R C", true, "L R C"},
-			 {"* * *", "L L R", true, "L R *"},
-			 {"* * *", "* C *", true, "C * *"},
-			 {"* *", "L R C", true, "L R"},
-			 {"* R", "R C L", true, "C R"},
-			 {"* 5", "5 6", true, "6 5"},
-			 {"L R", "C LFE", false, "Pl"},
-			 {"* *", "", false, "Pl"},
-			 {"* *", "* *", false, "Pl"},
-			 {"L *", "L", false, "Pl"},
-			 {"", "L R", false, "Pl"},
-		 })
+	for (const auto& [source, destination, hasChanged, result] :
+		std::initializer_list<Case>{{"L * *", "L R C", true, "L R C"}, {"* * *", "L L R", true, "L R *"},
+			{"* * *", "* C *", true, "C * *"}, {"* *", "L R C", true, "L R"}, {"* R", "R C L", true, "C R"},
+			{"* 5", "5 6", true, "6 5"}, {"L R", "C LFE", false, "Pl"}, {"* *", "", false, "Pl"},
+			{"* *", "* *", false, "Pl"}, {"L *", "L", false, "Pl"}, {"", "L R", false, "Pl"}})
 	{
 		AudioChannelLayout layout = ReadLayout("Pl");
 		EXPECT_EQ(ReplaceDiscreteLabelsWithDestinationLayoutLabels(ReadLayout(source), ReadLayout(destination), layout),

@@ -16,7 +16,7 @@ using namespace zonmediatypes;
 static_assert(std::has_virtual_destructor_v<AudioFormat> && std::is_nothrow_move_constructible_v<AudioFormat>);
 static_assert(kAudioSampleRate_Invalid == -1);
 
-AudioFormat Format(const char* inLayout, std::uint32_t inRate = 48'000, int inType = 40)
+AudioFormat Format(const char* inLayout, std::uint32_t inRate = 48'000, int inType = kAudioSampleType_32Bit)
 {
 	AudioFormat format = AudioFormat::CreateAudioFormat(ReadLayout(inLayout), inRate);
 	format.SetSampleType(static_cast<AudioSampleType>(inType));
@@ -35,9 +35,9 @@ TEST(AudioFormat, StartsEmptyOrWithDefaults)
 							 : AudioChannelLayout(count));
 		EXPECT_EQ(format.GetChannelCount(), count);
 		EXPECT_EQ(format.GetSampleRate(), static_cast<std::int32_t>(0x8000'0000 + count));
-		EXPECT_EQ(format.GetSampleType(), 40);
+		EXPECT_EQ(format.GetSampleType(), kAudioSampleType_32Bit);
 	}
-	EXPECT_EQ(AudioFormat::CreateAudioFormat(ReadLayout("C"), 1), Format("C", 1, 40));
+	EXPECT_EQ(AudioFormat::CreateAudioFormat(ReadLayout("C"), 1), Format("C", 1));
 }
 
 TEST(AudioFormat, AlignsToTheBytesOfAllChannels)
