@@ -86,12 +86,23 @@ TEST(FFmpegPixelFormat, OfCodecsGoesByFieldsMatrixAndRange)
 
 TEST(FFmpegVideo, FieldsAndShapesGoBothWays)
 {
-	const std::pair<AVFieldOrder, FieldType> orders[]
-		= {{AV_FIELD_UNKNOWN, kFieldType_Invalid}, {AV_FIELD_PROGRESSIVE, kFieldType_NoFields},
-			{AV_FIELD_TT, kFieldType_UpperFirst}, {AV_FIELD_BT, kFieldType_UpperFirst},
-			{AV_FIELD_BB, kFieldType_LowerFirst}, {AV_FIELD_TB, kFieldType_LowerFirst}};
-	for (const auto& [order, type] : orders)
-		EXPECT_EQ(ToFieldType(order), type) << order;
+	const struct
+	{
+		AVFieldOrder mOrder;
+		FieldType mInQuickTime, mElsewhere;
+	} orders[] = {{AV_FIELD_UNKNOWN, kFieldType_Invalid, kFieldType_Invalid},
+		{AV_FIELD_PROGRESSIVE, kFieldType_NoFields, kFieldType_NoFields},
+		{AV_FIELD_TT, kFieldType_UpperFirst, kFieldType_UpperFirst},
+		{AV_FIELD_BB, kFieldType_LowerFirst, kFieldType_LowerFirst},
+		{AV_FIELD_TB, kFieldType_UpperFirst, kFieldType_LowerFirst},
+		{AV_FIELD_BT, kFieldType_LowerFirst, kFieldType_UpperFirst}};
+	for (const auto& [order, inQuickTime, elsewhere] : orders)
+	{
+		for (const char* const format : {"mov,mp4,m4a,3gp,3g2,mj2", "mov", "matroska,webm"})
+			EXPECT_EQ(ToFieldType(order, format), inQuickTime) << order << " in " << format;
+		for (const char* const format : {"mxf", "mpegts", "avi", "movie", ""})
+			EXPECT_EQ(ToFieldType(order, format), elsewhere) << order << " in " << format;
+	}
 	for (const PixelAspectRatio ratio : AllPixelAspectRatios())
 		EXPECT_EQ(ToPixelAspectRatio(ToSampleAspectRatio(ratio)), ratio) << ratio;
 	for (const AVRational unknown : {AVRational{0, 1}, AVRational{1, 0}, AVRational{-4, 3}, AVRational{4, -3}})

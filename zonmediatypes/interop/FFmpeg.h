@@ -14,6 +14,7 @@
 ///
 ///     PixelFormat format = ToPixelFormat(*stream->codecpar, stream->avg_frame_rate);   // or kPixelFormat_Invalid
 ///     PixelAspectRatio ratio = ToPixelAspectRatio(av_guess_sample_aspect_ratio(file, stream, nullptr));
+///     FieldType fields = ToFieldType(stream->codecpar->field_order, file->iformat->name);
 
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/Descriptions.h"
@@ -33,6 +34,7 @@
 #include <limits>
 #include <new>
 #include <optional>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -145,8 +147,18 @@ AVChannelLayout ToAVChannelLayout(const AudioChannelLayout& inLayout);
 /// is video range for YUV and full range for RGB. Other matrices have no counterpart.
 PixelFormat ToPixelFormat(const AVCodecParameters& inParameters, AVRational inFrameRate);
 
-/// The field that is shown first; kFieldType_Invalid when that is not known.
-FieldType ToFieldType(AVFieldOrder inOrder);
+/// The field that is shown first in a stream of a file; kFieldType_Invalid when that is not known. inFormat is the name of
+/// the format that the order was read from, `file->iformat->name`, because AV_FIELD_TB and AV_FIELD_BT mean two things: in
+/// QuickTime and Matroska the lines of both fields lie interleaved, and the top (TB) or the bottom field (BT) is the earlier
+/// one; everywhere else the one field is stored first and the other one shown first.
+///
+/// What a file says may be wrong. A decoded frame of a codec that knows (`interlaced_frame`, `top_field_first`) is surer.
+FieldType ToFieldType(AVFieldOrder inOrder, std::string_view inFormat);
+
+/// As above for AV_FIELD_TT, AV_FIELD_BB and AV_FIELD_PROGRESSIVE, which mean one thing everywhere; AV_FIELD_TB and
+/// AV_FIELD_BT are kFieldType_Invalid.
+[[deprecated("say where the order comes from: ToFieldType(order, file->iformat->name)")]] FieldType ToFieldType(
+	AVFieldOrder inOrder);
 
 /// A stream's sample aspect ratio as it is; kPixelAspectRatio_Unknown when it is not known, or not positive.
 PixelAspectRatio ToPixelAspectRatio(AVRational inRatio);
@@ -464,8 +476,21 @@ inline PixelFormat ToPixelFormat(const AVCodecParameters& inParameters, AVRation
 	}
 }
 
-inline FieldType ToFieldType(AVFieldOrder inOrder)
+namespace detail
 {
+
+// FFmpeg's names of a format have commas between them: "mov,mp4,m4a,3gp,3g2,mj2", "matroska,webm".
+constexpr bool HasInterleavedOrders(std::string_view inFormat)
+{
+	constexpr std::string_view kFormats[] = {"mov", "mp4", "matroska", "webm"};
+	return std::ranges::find(kFormats, inFormat.substr(0, inFormat.find(','))) != std::end(kFormats);
+}
+
+}   // namespace detail
+
+inline FieldType ToFieldType(AVFieldOrder inOrder, std::string_view inFormat)
+{
+	const bool isTopEarlier = inOrder == AV_FIELD_TB;
 	switch (inOrder)
 	{
 	case AV_FIELD_UNKNOWN:
@@ -473,13 +498,20 @@ inline FieldType ToFieldType(AVFieldOrder inOrder)
 	case AV_FIELD_PROGRESSIVE:
 		return kFieldType_NoFields;
 	case AV_FIELD_TT:
-	case AV_FIELD_BT:   // stored bottom first, shown top first
 		return kFieldType_UpperFirst;
 	case AV_FIELD_BB:
-	case AV_FIELD_TB:
 		return kFieldType_LowerFirst;
+	case AV_FIELD_TB:
+	case AV_FIELD_BT:
+		return isTopEarlier == detail::HasInterleavedOrders(inFormat) ? kFieldType_UpperFirst : kFieldType_LowerFirst;
 	}
 	return kFieldType_Invalid;
+}
+
+inline FieldType ToFieldType(AVFieldOrder inOrder)
+{
+	const bool dependsOnFormat = inOrder == AV_FIELD_TB || inOrder == AV_FIELD_BT;
+	return dependsOnFormat ? kFieldType_Invalid : ToFieldType(inOrder, {});
 }
 
 inline PixelAspectRatio ToPixelAspectRatio(AVRational inRatio)
