@@ -5,6 +5,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <nlohmann/json.hpp>
+#include <tuple>
 #include <utility>
 
 namespace
@@ -37,6 +38,20 @@ void ExpectFacts(const json& inDocument, const Facts& inFacts)
 		ASSERT_TRUE(inDocument.contains(pointer)) << place << " in " << inDocument.dump(2);
 		EXPECT_EQ(inDocument.at(pointer), value) << place;
 	}
+}
+
+constexpr const char* kNoFFmpeg = "ffmpeg makes the files of this test, and it is not installed";
+
+// The folder of what a script makes, once for all tests; empty without ffmpeg.
+std::string Made(const std::string& inScript)
+{
+	const std::string folder = kScratch + inScript;
+	if (std::filesystem::exists(folder))
+		return folder;
+	if (std::system("ffmpeg -version >/dev/null 2>&1") != 0)
+		return "";
+	EXPECT_EQ(std::system(("sh " + ShellQuoted(ZON_TEST_DATA "/" + inScript) + " " + ShellQuoted(folder)).c_str()), 0);
+	return folder;
 }
 
 // ---- Results of commands ---------------------------------------------------------------------------------------------
@@ -280,11 +295,9 @@ TEST(Zonmedia, ShowsTheClip)
 
 TEST(Zonmedia, ShowsWhatOtherSoftwareWrites)
 {
-	if (std::system("ffmpeg -version >/dev/null 2>&1") != 0)
-		GTEST_SKIP() << "ffmpeg makes the files of this test, and it is not installed";
-	const std::string folder = kScratch + "media";
-	ASSERT_EQ(
-		std::system(("sh " + ShellQuoted(ZON_TEST_DATA "/make-media.sh") + " " + ShellQuoted(folder)).c_str()), 0);
+	const std::string folder = Made("make-media.sh");
+	if (folder.empty())
+		GTEST_SKIP() << kNoFFmpeg;
 	for (const auto& [file, facts] : std::initializer_list<std::pair<std::string, Facts>>{
 			 {"v210-drop.mov", {{"/start/text", "01:00:00;00"}, {"/lastFrame/text", "01:00:00;01"}, {"/frames", 2}}},
 			 {"v210-non-drop.mov", {{"/rate", "24000/1001"}, {"/display", "23.976"}, {"/end/text", "01:00:00:02"}}},
@@ -325,8 +338,115 @@ TEST(Zonmedia, ShowsWhatOtherSoftwareWrites)
 		SCOPED_TRACE(file);
 		ExpectFacts(Document({"sheet", folder + "/" + file}).at("files").at(0), facts);
 	}
-	for (const char* const file : {"notes.txt", "empty.mov", "letters.bin"})
-		EXPECT_THAT(Zonmedia({"sheet", folder + "/" + file}).mErrors, HasSubstr("not a media file")) << file;
+}
+
+TEST(Zonmedia, TellsHowLongVideoIs)
+{
+	const std::string folder = Made("make-media.sh");
+	if (folder.empty())
+		GTEST_SKIP() << kNoFFmpeg;
+	const char* const average = "/variableFrameRate/average";
+	const char* const lowest = "/variableFrameRate/lowest";
+	const Facts twoSeconds = {{"/frames", 50}, {"/duration/text", "00:00:02:00"}, {"/variableFrameRate", nullptr}};
+	const Facts uneven = {{"/frames", 62}, {"/duration/text", "00:00:19:21"}, {average, 3.125}, {lowest, 25.0 / 15},
+		{"/variableFrameRate/highest", 25.0}, {"/lastFrame", nullptr}, {"/missing", nullptr}};
+	for (const auto& [file, facts, isScan] : std::initializer_list<std::tuple<std::string, Facts, bool>>{
+			 {"short-picture.mkv", twoSeconds, false},         // beside ten seconds of sound
+			 {"large-short-picture.mkv", twoSeconds, false},   // not read, but stated
+			 {"short-picture.ts", twoSeconds, false},
+			 {"short.mpg", twoSeconds, false},
+			 {"edited.mp4", {{"/frames", 35}}, false},
+			 {"large-edited.mp4", {{"/frames", 35}}, false},
+			 {"uneven.mp4", uneven, false},
+			 {"large-uneven.mp4", uneven, true},
+			 {"large-uneven.mp4", {{"/frames", 62}, {average, 3.125}, {lowest, nullptr}}, false},
+			 {"large-counted.mkv", {{"/frames", 62}, {lowest, nullptr}}, false},
+			 {"large-uneven.mkv", {{"/frames", nullptr}, {lowest, nullptr}}, false},
+			 {"large-uneven.mkv", {{"/frames", 62}, {lowest, 25.0 / 15}}, true},
+			 {"cut-raw.avi", {{"/frames", 38}, {"/missing", {{"present", 38}, {"stated", 50}}}}, false},
+			 {"cut-counted.mkv", {{"/missing/stated", 62}}, true},
+		 })
+	{
+		SCOPED_TRACE(file);
+		std::vector<std::string> arguments{"sheet", folder + "/" + file};
+		if (isScan)
+			arguments.emplace_back("--scan");
+		ExpectFacts(Document(arguments).at("files").at(0), facts);
+	}
+	EXPECT_THAT(
+		Zonmedia({"sheet", folder + "/cut-raw.avi"}).mOutput, HasSubstr("truncated: 38 of 50 frames are there"));
+}
+
+TEST(Zonmedia, ShowsStillsWithoutTimes)
+{
+	const std::string folder = Made("make-media.sh");
+	if (folder.empty())
+		GTEST_SKIP() << kNoFFmpeg;
+	for (const std::string name : {"still.png", "still.jpg", "still.tiff", "still.dpx", "still.bmp", "still-%03d.png"})
+	{
+		const json sheet = Document({"sheet", folder + "/" + name}).at("files").at(0);
+		EXPECT_EQ(sheet["imageSize"]["width"], 48) << sheet;
+		EXPECT_FALSE(sheet.contains("rate") || sheet.contains("duration") || sheet.contains("fields")) << sheet;
+	}
+	ExpectFacts(
+		Document({"sheet", folder + "/still.jpg"}), {{"/files/0/format", "JPEG"}, {"/files/0/storedAs", "yuvj444p"}});
+}
+
+TEST(Zonmedia, SaysWhatIsNoMediaOrNoFile)
+{
+	const std::string folder = Made("make-media.sh");
+	if (folder.empty())
+		GTEST_SKIP() << kNoFFmpeg;
+	for (const auto& [file, complaint] : std::initializer_list<std::pair<std::string, const char*>>{
+			 {"notes.txt", "not a media file"}, {"letters.bin", "not a media file"},
+			 {"empty.mov", "not a media file: it is empty"}, {"empty.h264", "it is empty"},
+			 {"empty.flac", "it is empty"}, {"cut-v210-drop.mov", "QuickTime / MOV without its index (moov)"},
+			 {"pipe", "no regular file"}, {".", "a folder"}})
+		ExpectComplaint(Zonmedia({"sheet", folder + "/" + file}), 1, complaint);
+}
+
+TEST(Zonmedia, ReadsStandardInput)
+{
+	const Outcome file = Zonmedia({"sheet", "-"}, FileText(kClip));
+	EXPECT_THAT(file.mOutput, HasSubstr("00:59:58;00"));
+	const std::string piped = "cat " + ShellQuoted(kClip) + " | " + ShellQuoted(ZON_PROGRAM) + " sheet - >";
+	EXPECT_EQ(std::system((piped + ShellQuoted(kScratch + "piped")).c_str()), 0);
+	EXPECT_EQ(FileText(kScratch + "piped"), file.mOutput);
+	ExpectComplaint(Zonmedia({"sheet", "-"}, "Notes"), 1, "-: not a media file");
+}
+
+TEST(Zonmedia, TellsTheOrderOfFields)
+{
+	const std::string folder = Made("make-fields.sh");
+	if (folder.empty())
+		GTEST_SKIP() << kNoFFmpeg;
+	struct Order
+	{
+		std::string mMade, mJudged, mShown;
+	};
+	const Order orders[] = {{"upper", "tff", "Upper Field First"}, {"lower", "bff", "Lower Field First"},
+		{"progressive", "progressive", "No Fields (Progressive Scan)"}};
+	std::vector<std::string> arguments{"sheet"};
+	std::vector<std::pair<std::string, std::string>> judged;   // file and verdict on its pictures
+	std::ifstream list(folder + "/judged.txt");
+	for (std::string file, verdict; list >> file >> verdict;)
+	{
+		arguments.push_back(folder + "/" + file);
+		judged.emplace_back(file, verdict);
+	}
+	ASSERT_GT(judged.size(), 100u);
+	const json sheets = Document(arguments).at("files");
+	ASSERT_EQ(sheets.size(), judged.size());
+	for (std::size_t i = 0; i < judged.size(); ++i)
+	{
+		const auto& [file, verdict] = judged[i];
+		const auto order = std::ranges::find_if(
+			orders, [name = file](const Order& inOrder) { return name.find(inOrder.mMade) != std::string::npos; });
+		ASSERT_NE(order, std::end(orders)) << file;
+		EXPECT_EQ(verdict, order->mJudged) << file << ": the file is not what it is to be";
+		const bool isSilent = file.starts_with("v210") && file.ends_with(".avi");   // neither of which says
+		EXPECT_EQ(sheets[i]["fields"], isSilent ? "Field Presence Unknown" : order->mShown) << file;
+	}
 }
 
 }   // namespace

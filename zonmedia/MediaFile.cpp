@@ -1,23 +1,18 @@
 #include "zonmedia/MediaFile.h"
 
+#include "zonmedia/FieldOrder.h"
+#include "zonmedia/MediaInput.h"
+#include "zonmedia/PacketReader.h"
 #include "zonmedia/Problem.h"
 #include "zonmediatypes/interop/FFmpeg.h"
 
 #include <algorithm>
-#include <array>
 #include <charconv>
 #include <cmath>
-#include <limits>
-#include <memory>
-#include <span>
-#include <string_view>
 
 extern "C"
 {
-#include <libavcodec/avcodec.h>
-#include <libavformat/avformat.h>
 #include <libavutil/dict.h>
-#include <libavutil/error.h>
 #include <libavutil/log.h>
 #include <libavutil/pixdesc.h>
 }
@@ -27,51 +22,6 @@ namespace zonmedia
 
 namespace
 {
-
-struct CloseFormat
-{
-	void operator()(AVFormatContext* inContext) const { avformat_close_input(&inContext); }
-};
-using Format = std::unique_ptr<AVFormatContext, CloseFormat>;
-
-struct FreePacket
-{
-	void operator()(AVPacket* inPacket) const { av_packet_free(&inPacket); }
-};
-
-std::span<AVStream* const> Streams(const AVFormatContext& inContext)
-{
-	return {inContext.streams, inContext.nb_streams};
-}
-
-std::string Reason(int inError)
-{
-	if (inError == AVERROR_INVALIDDATA || inError == AVERROR_EOF)
-		return "not a media file";
-	std::array<char, AV_ERROR_MAX_STRING_SIZE> text{};
-	av_strerror(inError, text.data(), text.size());
-	return text.data();
-}
-
-Format Open(const std::string& inPath)
-{
-	// Names on the command line are files, whatever they look like; and a file may refer to other files only.
-	AVDictionary* options = nullptr;
-	av_dict_set(&options, "protocol_whitelist", "file", 0);
-	AVFormatContext* context = nullptr;
-	const int opened = avformat_open_input(&context, ("file:" + inPath).c_str(), nullptr, &options);
-	av_dict_free(&options);
-	if (opened < 0)
-		throw InputProblem(Reason(opened));
-	Format format(context);
-	// Plain text passes for the drawings of text terminals, which are no media.
-	if (std::string_view(format->iformat->name) == "tty")
-		throw InputProblem(Reason(AVERROR_INVALIDDATA));
-	const int read = avformat_find_stream_info(format.get(), nullptr);
-	if (read < 0)
-		throw InputProblem(Reason(read));
-	return format;
-}
 
 // ---- Tags ------------------------------------------------------------------------------------------------------------
 
@@ -105,51 +55,6 @@ std::optional<std::int64_t> StartSample(const AVFormatContext& inContext)
 	return isNumber ? std::optional(sample) : std::nullopt;
 }
 
-// ---- Durations -------------------------------------------------------------------------------------------------------
-
-// inDuration in units of 1/inRate seconds, to the nearest; nothing when it is unknown or beyond counting.
-std::optional<std::int64_t> Rescaled(std::int64_t inDuration, AVRational inTimeBase, AVRational inRate)
-{
-	if (inDuration == AV_NOPTS_VALUE || inDuration <= 0 || inRate.num <= 0 || inRate.den <= 0)
-		return std::nullopt;
-	const std::int64_t count = av_rescale_q_rnd(inDuration, inTimeBase, av_inv_q(inRate), AV_ROUND_NEAR_INF);
-	return count > 0 ? std::optional(count) : std::nullopt;
-}
-
-// The number of units of 1/inRate seconds by reading the whole stream: a packet of video is a frame, one of audio says how
-// long it is.
-std::optional<std::int64_t> Counted(AVFormatContext& ioContext, const AVStream& inStream, AVRational inRate)
-{
-	const std::unique_ptr<AVPacket, FreePacket> packet(av_packet_alloc());
-	if (packet == nullptr || av_seek_frame(&ioContext, inStream.index, 0, AVSEEK_FLAG_BACKWARD) < 0)
-		return std::nullopt;
-	std::int64_t packets = 0;
-	std::int64_t duration = 0;
-	for (; av_read_frame(&ioContext, packet.get()) >= 0; av_packet_unref(packet.get()))
-	{
-		if (packet->stream_index != inStream.index)
-			continue;
-		++packets;
-		duration += std::clamp<std::int64_t>(packet->duration, 0, std::numeric_limits<std::int32_t>::max());
-	}
-	const bool isVideo = inStream.codecpar->codec_type == AVMEDIA_TYPE_VIDEO;
-	return isVideo ? std::optional(packets) : Rescaled(duration, inStream.time_base, inRate);
-}
-
-// The length of a stream in units of 1/inRate seconds.
-std::optional<std::int64_t> Length(AVFormatContext& ioContext, const AVStream& inStream, AVRational inRate)
-{
-	// A length that was worked out from the file's size and bit rate is no count.
-	const bool isGuess = ioContext.duration_estimation_method == AVFMT_DURATION_FROM_BITRATE;
-	if (!isGuess && inStream.duration != AV_NOPTS_VALUE)
-		return Rescaled(inStream.duration, inStream.time_base, inRate);
-	if (inStream.codecpar->codec_type == AVMEDIA_TYPE_VIDEO && inStream.nb_frames > 0)
-		return inStream.nb_frames;
-	if (!isGuess && ioContext.duration != AV_NOPTS_VALUE)
-		return Rescaled(ioContext.duration, av_get_time_base_q(), inRate);
-	return Counted(ioContext, inStream, inRate);
-}
-
 // ---- Streams ---------------------------------------------------------------------------------------------------------
 
 std::string OrEmpty(const char* inText)
@@ -159,28 +64,46 @@ std::string OrEmpty(const char* inText)
 
 // The rate of a picture. Readers round what they find to a usual rate; a file whose clock ticks once a frame says it
 // exactly, 2997/100 for instance.
-AVRational FrameRateOf(AVFormatContext& ioContext, AVStream& inStream)
+AVRational FrameRateOf(AVFormatContext& ioFile, AVStream& inStream)
 {
 	constexpr double kRounding = 0.005;
-	const AVRational rate = av_guess_frame_rate(&ioContext, &inStream, nullptr);
+	const AVRational rate = av_guess_frame_rate(&ioFile, &inStream, nullptr);
 	const AVRational clock = av_inv_q(inStream.time_base);
 	return std::abs(av_q2d(clock) / av_q2d(rate) - 1.0) < kRounding ? clock : rate;
 }
 
-VideoStream ReadVideo(AVFormatContext& ioContext, AVStream& inStream)
+VideoStream ReadPicture(AVFormatContext& ioFile, AVStream& ioStream, AVRational inRate)
 {
-	const AVCodecParameters& parameters = *inStream.codecpar;
-	const AVRational rate = FrameRateOf(ioContext, inStream);
+	const AVCodecParameters& parameters = *ioStream.codecpar;
 	VideoStream video;
 	video.mCodec = avcodec_get_name(parameters.codec_id);
 	video.mStoredFormat = OrEmpty(av_get_pix_fmt_name(static_cast<AVPixelFormat>(parameters.format)));
-	video.mRate = rate.num > 0 && rate.den > 0 ? Reduced({rate.num, rate.den}) : Fraction{};
-	video.mFrameCount = Length(ioContext, inStream, rate);
 	video.mWidth = parameters.width;
 	video.mHeight = parameters.height;
-	video.mPixelFormat = zonmediatypes::ToPixelFormat(parameters, rate);
-	video.mPixelShape = zonmediatypes::ToPixelAspectRatio(av_guess_sample_aspect_ratio(&ioContext, &inStream, nullptr));
-	video.mFieldType = zonmediatypes::ToFieldType(parameters.field_order);
+	video.mPixelFormat = zonmediatypes::ToPixelFormat(parameters, inRate);
+	video.mPixelShape = zonmediatypes::ToPixelAspectRatio(av_guess_sample_aspect_ratio(&ioFile, &ioStream, nullptr));
+	return video;
+}
+
+// What goes by the field order is to go by the one that was found.
+AVFieldOrder OrderOf(zonmediatypes::FieldType inFields)
+{
+	if (inFields == zonmediatypes::kFieldType_NoFields)
+		return AV_FIELD_PROGRESSIVE;
+	if (inFields == zonmediatypes::kFieldType_UpperFirst)
+		return AV_FIELD_TT;
+	return inFields == zonmediatypes::kFieldType_LowerFirst ? AV_FIELD_BB : AV_FIELD_UNKNOWN;
+}
+
+VideoStream ReadVideo(AVFormatContext& ioFile, AVStream& ioStream, PacketReader& ioPackets, const Scan& inScan)
+{
+	const AVRational rate = FrameRateOf(ioFile, ioStream);
+	const zonmediatypes::FieldType fields = ReadFieldType(ioFile, ioStream, ioPackets);
+	ioStream.codecpar->field_order = OrderOf(fields);
+	VideoStream video = ReadPicture(ioFile, ioStream, rate);
+	video.mFieldType = fields;
+	video.mRate = rate.num > 0 && rate.den > 0 ? Reduced({rate.num, rate.den}) : Fraction{};
+	video.mLength = ReadVideoLength(ioFile, ioStream, rate, ioPackets, inScan);
 	return video;
 }
 
@@ -191,39 +114,64 @@ zonmediatypes::AudioChannelLayout LayoutOf(const AVChannelLayout& inLayout)
 	return isStereo ? zonmediatypes::CreateStereoChannelLayout() : zonmediatypes::ToAudioChannelLayout(inLayout);
 }
 
-AudioStream ReadAudio(AVFormatContext& ioContext, const AVStream& inStream)
+AudioStream ReadAudio(AVFormatContext& ioFile, const AVStream& inStream, PacketReader& ioPackets)
 {
 	const AVCodecParameters& parameters = *inStream.codecpar;
 	AudioStream audio;
 	audio.mCodec = avcodec_get_name(parameters.codec_id);
 	audio.mSampleRate = parameters.sample_rate;
 	audio.mLayout = LayoutOf(parameters.ch_layout);
-	audio.mSampleCount = Length(ioContext, inStream, {parameters.sample_rate, 1});
+	audio.mSampleCount = ReadSampleCount(ioFile, inStream, ioPackets);
 	return audio;
+}
+
+// A stream of which nothing was found to be seen or heard, as in a file that has only just begun, is none.
+bool IsVideo(const AVStream& inStream)
+{
+	const bool isCover = (inStream.disposition & AV_DISPOSITION_ATTACHED_PIC) != 0;
+	const AVCodecParameters& parameters = *inStream.codecpar;
+	return parameters.codec_type == AVMEDIA_TYPE_VIDEO && !isCover && parameters.width > 0 && parameters.height > 0;
+}
+
+bool IsAudio(const AVStream& inStream)
+{
+	const AVCodecParameters& parameters = *inStream.codecpar;
+	return parameters.codec_type == AVMEDIA_TYPE_AUDIO && parameters.sample_rate > 0;
+}
+
+void ReadStreams(AVFormatContext& ioFile, const Scan& inScan, MediaFile& ioMedia)
+{
+	PacketReader packets(ioFile);
+	const auto streams = Streams(ioFile);
+	const auto video = std::ranges::find_if(streams, [](const AVStream* inStream) { return IsVideo(*inStream); });
+	// The picture first, whose first frame is found from the beginning of the file.
+	if (video != streams.end())
+		ioMedia.mVideo
+			= ioMedia.mIsStill ? ReadPicture(ioFile, **video, {}) : ReadVideo(ioFile, **video, packets, inScan);
+	else if (inScan.mIsWanted)
+		packets.ReadAll(inScan.mProgress);
+	for (const AVStream* stream : Streams(ioFile))
+	{
+		if (IsAudio(*stream))
+			ioMedia.mAudio.push_back(ReadAudio(ioFile, *stream, packets));
+	}
 }
 
 }   // namespace
 
-MediaFile ReadMediaFile(const std::string& inPath)
+MediaFile ReadMediaFile(const std::string& inPath, const Scan& inScan)
 {
 	av_log_set_level(AV_LOG_QUIET);   // what went wrong is said in one line, by the caller
-	const Format format = Open(inPath);
-	MediaFile file;
-	file.mFormat = format->iformat->long_name;
-	file.mStartTimecode = StartTimecode(*format);
-	file.mStartSample = StartSample(*format);
-	for (AVStream* stream : Streams(*format))
-	{
-		const AVMediaType type = stream->codecpar->codec_type;
-		const bool isPicture = (stream->disposition & AV_DISPOSITION_ATTACHED_PIC) != 0;
-		if (type == AVMEDIA_TYPE_VIDEO && !isPicture && !file.mVideo)
-			file.mVideo = ReadVideo(*format, *stream);
-		else if (type == AVMEDIA_TYPE_AUDIO)
-			file.mAudio.push_back(ReadAudio(*format, *stream));
-	}
-	if (!file.mVideo && file.mAudio.empty())
+	const Format format = OpenMedia(inPath);
+	MediaFile media;
+	media.mFormat = FormatName(*format);
+	media.mStartTimecode = StartTimecode(*format);
+	media.mStartSample = StartSample(*format);
+	media.mIsStill = IsStill(*format);
+	ReadStreams(*format, inScan, media);
+	if (!media.mVideo && media.mAudio.empty())
 		throw InputProblem("no video and no audio in this file");
-	return file;
+	return media;
 }
 
 }   // namespace zonmedia

@@ -6,6 +6,9 @@
 #include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/interop/TimeBase.h"
 
+#include <array>
+#include <charconv>
+#include <cmath>
 #include <optional>
 #include <string_view>
 #include <utility>
@@ -20,6 +23,7 @@ namespace
 {
 
 const Value kUnknown{"unknown", nullptr};
+constexpr const char* kUncounted = " (not counted; --scan does)";
 
 // ---- Times -----------------------------------------------------------------------------------------------------------
 
@@ -32,14 +36,17 @@ struct Span
 	TimeForm mForm;
 	TickTime mStart;
 	std::optional<std::int64_t> mCount;
-
-	// Nothing when it is unknown or outlasts what ticks can count.
-	std::optional<TickTime> Duration() const
-	{
-		const auto unit = TimeBase::FromRate(mRate.mRate);
-		return unit && mCount ? unit->ToTicks(*mCount, Rounding::Nearest) : std::nullopt;
-	}
+	std::optional<TickTime> mDuration;   // nothing when it is unknown or outlasts what ticks can count
+	bool mIsSteady = true;               // what is counted is all of one length
+	const char* mCountNote = "";         // behind the count, for people
 };
+
+// inCount frames or samples at a steady rate.
+std::optional<TickTime> SteadyDuration(std::optional<std::int64_t> inCount, FrameRate inRate)
+{
+	const auto unit = TimeBase::FromRate(inRate);
+	return unit && inCount ? unit->ToTicks(*inCount, Rounding::Nearest) : std::nullopt;
+}
 
 // The start that a timecode tag states; nothing for text that is no timecode.
 std::optional<TickTime> TaggedStart(const std::string& inTag, FrameRate inRate, TimeForm inForm)
@@ -58,14 +65,17 @@ std::optional<TickTime> TaggedStart(const std::string& inTag, FrameRate inRate, 
 // timecode are counted in bare frames.
 std::optional<Span> PictureSpan(const MediaFile& inFile)
 {
-	const std::optional<Rate> rate = inFile.mVideo ? MakeRate(inFile.mVideo->mRate) : std::nullopt;
+	const std::optional<Rate> rate = inFile.mVideo && !inFile.mIsStill ? MakeRate(inFile.mVideo->mRate) : std::nullopt;
 	if (!rate)
 		return std::nullopt;
 	const std::string& tag = inFile.mStartTimecode;
 	const bool isDropFrame = tag.empty() || tag.find(';') != std::string::npos;
 	const TimeForm form{GetTimeDisplayForFrameRate(rate->mRate, isDropFrame, false, kTimeDisplay_Frames, false)};
 	const TickTime start = TaggedStart(tag, rate->mRate, form).value_or(kTime_Zero);
-	return Span{"frame", "Frames", *rate, form, start, inFile.mVideo->mFrameCount};
+	const VideoLength& length = inFile.mVideo->mLength;
+	const auto duration = length.mVariation ? length.mDuration : SteadyDuration(length.mFrameCount, rate->mRate);
+	return Span{"frame", "Frames", *rate, form, start, length.mFrameCount, duration, !length.mVariation,
+		length.mIsByDuration ? kUncounted : ""};
 }
 
 std::optional<Span> SoundSpan(const MediaFile& inFile)
@@ -76,7 +86,9 @@ std::optional<Span> SoundSpan(const MediaFile& inFile)
 		return std::nullopt;
 	TickTime start;
 	start.AddFrames(inFile.mStartSample.value_or(0), rate->mRate);
-	return Span{"sample", "Samples", *rate, {kTimeDisplay_AudioSamples}, start, inFile.mAudio.front().mSampleCount};
+	const std::optional<std::int64_t> count = inFile.mAudio.front().mSampleCount;
+	return Span{
+		"sample", "Samples", *rate, {kTimeDisplay_AudioSamples}, start, count, SteadyDuration(count, rate->mRate)};
 }
 
 void AddRate(Record& ioSheet, const Rate& inRate)
@@ -88,35 +100,67 @@ void AddRate(Record& ioSheet, const Rate& inRate)
 	ioSheet.Add("Rate is rounded", {"", inRate.mIsRounded});
 }
 
-void AddEnd(Record& ioSheet, const Span& inSpan, TickTime inEnd)
+// Where the frames differ in length, the one that is last does not begin a frame before the end.
+void AddEnd(Record& ioSheet, const Span& inSpan, std::optional<TickTime> inEnd)
 {
 	const FrameRate rate = inSpan.mRate.mRate;
-	const Value end = TimeValue(inEnd, rate, inSpan.mForm);
-	const std::string last = TimeText(inEnd, rate, inSpan.mForm, kTimecodeFlag_LastFrame);
-	TickTime lastTime = inEnd;
+	const std::string lastName = std::string("Last ") + inSpan.mUnit;
+	const Value end = inEnd ? TimeValue(*inEnd, rate, inSpan.mForm) : kUnknown;
+	if (!inEnd || !inSpan.mIsSteady)
+	{
+		ioSheet.Add("End", end);
+		ioSheet.Add(lastName, {"", nullptr});
+		return;
+	}
+	const std::string last = TimeText(*inEnd, rate, inSpan.mForm, kTimecodeFlag_LastFrame);
+	TickTime lastTime = *inEnd;
 	lastTime.AddFrames(-1, rate);
 	ioSheet.Add("End", {end.mText + " (last " + inSpan.mUnit + " " + last + ")", end.mJson});
-	ioSheet.Add(std::string("Last ") + inSpan.mUnit, {"", Json{{"text", last}, {"ticks", lastTime.GetTicks()}}});
+	ioSheet.Add(lastName, {"", Json{{"text", last}, {"ticks", lastTime.GetTicks()}}});
 }
 
 void AddTimes(Record& ioSheet, const Span& inSpan)
 {
 	const FrameRate rate = inSpan.mRate.mRate;
-	const std::optional<TickTime> duration = inSpan.Duration();
-	AddRate(ioSheet, inSpan.mRate);
+	const std::optional<TickTime> duration = inSpan.mDuration;
 	ioSheet.Add("Display", {DescriptionOf(inSpan.mForm), NameOf(inSpan.mForm)});
 	ioSheet.Add("Start", TimeValue(inSpan.mStart, rate, inSpan.mForm));
-	if (duration)
-	{
-		AddEnd(ioSheet, inSpan, inSpan.mStart + *duration);
-	}
-	else
-	{
-		ioSheet.Add("End", kUnknown);
-		ioSheet.Add(std::string("Last ") + inSpan.mUnit, {"", nullptr});
-	}
+	AddEnd(ioSheet, inSpan, duration ? std::optional(inSpan.mStart + *duration) : std::nullopt);
 	ioSheet.Add("Duration", duration ? TimeValue(*duration, rate, inSpan.mForm) : kUnknown);
-	ioSheet.Add(inSpan.mUnits, duration ? Value(*inSpan.mCount) : kUnknown);
+	const bool isCounted = inSpan.mCount && (duration || !inSpan.mIsSteady);
+	const Value count = isCounted ? Value(*inSpan.mCount) : kUnknown;
+	ioSheet.Add(inSpan.mUnits, {count.mText + inSpan.mCountNote, count.mJson});
+}
+
+// ---- What a scan finds -----------------------------------------------------------------------------------------------
+
+// A rate to two decimals, without zeros at the end.
+std::string RateText(double inRate)
+{
+	std::array<char, 32> text{};
+	const auto hundredths = std::round(inRate * 100.0) / 100.0;
+	return {text.data(), std::to_chars(text.data(), text.data() + text.size(), hundredths).ptr};
+}
+
+Value VariationValue(const std::optional<RateVariation>& inVariation)
+{
+	if (!inVariation)
+		return {"", nullptr};
+	const auto& [average, lowest, highest] = *inVariation;
+	const auto json = [](std::optional<double> inRate) { return inRate ? Json(*inRate) : Json(nullptr); };
+	std::string text = RateText(average) + "fps on average";
+	if (lowest && highest)
+		text += ", " + RateText(*lowest) + "fps to " + RateText(*highest) + "fps";
+	return {text, Json{{"average", average}, {"lowest", json(lowest)}, {"highest", json(highest)}}};
+}
+
+Value MissingValue(const VideoLength& inLength)
+{
+	if (!inLength.mStatedCount || !inLength.mFrameCount)
+		return {"", nullptr};
+	const std::string text = "truncated: " + std::to_string(*inLength.mFrameCount) + " of "
+		+ std::to_string(*inLength.mStatedCount) + " frames are there";
+	return {text, Json{{"present", *inLength.mFrameCount}, {"stated", *inLength.mStatedCount}}};
 }
 
 // ---- Picture ---------------------------------------------------------------------------------------------------------
@@ -147,15 +191,17 @@ Value PixelFormatValue(const VideoStream& inVideo)
 	return {text + " (" + name + ")", Json{{"text", text}, {"name", name}}};
 }
 
-void AddPicture(Record& ioSheet, const VideoStream& inVideo)
+void AddPicture(Record& ioSheet, const VideoStream& inVideo, bool inIsStill)
 {
 	const int width = inVideo.mWidth;
 	const int height = inVideo.mHeight;
 	const std::string size = UTF16to8(VideoFrameSizeDescription({0, 0, width, height}, inVideo.mPixelShape));
-	ioSheet.Add("Video codec", inVideo.mCodec);
-	ioSheet.Add("Frame size", {size, Json{{"text", size}, {"width", width}, {"height", height}}});
+	ioSheet.Add(inIsStill ? "Image codec" : "Video codec", inVideo.mCodec);
+	ioSheet.Add(
+		inIsStill ? "Image size" : "Frame size", {size, Json{{"text", size}, {"width", width}, {"height", height}}});
 	ioSheet.Add("Pixel shape", PixelShapeValue(inVideo.mPixelShape));
-	ioSheet.Add("Fields", UTF16to8(FieldTypeDescription(inVideo.mFieldType)));
+	if (!inIsStill)
+		ioSheet.Add("Fields", UTF16to8(FieldTypeDescription(inVideo.mFieldType)));
 	ioSheet.Add("Stored as", inVideo.mStoredFormat);
 	ioSheet.Add("Pixel format", PixelFormatValue(inVideo));
 }
@@ -191,29 +237,57 @@ Table DurationTable(const Span& inPicture, TickTime inDuration, const std::optio
 	return TimeTable("Duration in other displays", inDuration, inPicture.mRate.mRate, sampleRate, inPicture.mForm);
 }
 
+// ---- Sheets ----------------------------------------------------------------------------------------------------------
+
+void AddVideo(Record& ioSheet, const MediaFile& inFile)
+{
+	const std::optional<Span> picture = PictureSpan(inFile);
+	const VideoLength& length = inFile.mVideo->mLength;
+	ioSheet.Add("Timecode tag", TimecodeTagValue(inFile.mStartTimecode, picture));
+	if (!picture)
+		ioSheet.Add("Rate", kUnknown);
+	if (picture)
+		AddRate(ioSheet, picture->mRate);
+	ioSheet.Add("Variable frame rate", VariationValue(length.mVariation));
+	if (picture)
+		AddTimes(ioSheet, *picture);
+	ioSheet.Add("Missing", MissingValue(length));
+	AddPicture(ioSheet, *inFile.mVideo, false);
+	ioSheet.Add("Audio", AudioDescription(inFile));
+	if (picture && picture->mDuration)
+		ioSheet.mItems.emplace_back(DurationTable(*picture, *picture->mDuration, SoundSpan(inFile)));
+	ioSheet.mItems.emplace_back(AudioTable(inFile));
+}
+
+void AddSound(Record& ioSheet, const MediaFile& inFile)
+{
+	const std::optional<Span> sound = SoundSpan(inFile);
+	ioSheet.Add("Timecode tag", TimecodeTagValue(inFile.mStartTimecode, std::nullopt));
+	if (!sound)
+		ioSheet.Add("Rate", kUnknown);
+	if (sound)
+	{
+		AddRate(ioSheet, sound->mRate);
+		AddTimes(ioSheet, *sound);
+	}
+	if (sound && sound->mDuration)
+		ioSheet.Add("Milliseconds", TimeText(*sound->mDuration, sound->mRate.mRate, {kTimeDisplay_Milliseconds}));
+	ioSheet.Add("Audio", AudioDescription(inFile));
+	ioSheet.mItems.emplace_back(AudioTable(inFile));
+}
+
 }   // namespace
 
 Record MakeSheet(const std::string& inPath, const MediaFile& inFile)
 {
-	const std::optional<Span> picture = PictureSpan(inFile);
-	const std::optional<Span> sound = SoundSpan(inFile);
-	const std::optional<Span>& span = inFile.mVideo ? picture : sound;
-	const std::optional<TickTime> duration = span ? span->Duration() : std::nullopt;
 	Record sheet{{"File", inPath}, {}};
 	sheet.Add("Format", inFile.mFormat);
-	sheet.Add("Timecode tag", TimecodeTagValue(inFile.mStartTimecode, picture));
-	if (span)
-		AddTimes(sheet, *span);
+	if (inFile.mIsStill && inFile.mVideo)
+		AddPicture(sheet, *inFile.mVideo, true);
+	else if (inFile.mVideo)
+		AddVideo(sheet, inFile);
 	else
-		sheet.Add("Rate", kUnknown);
-	if (inFile.mVideo)
-		AddPicture(sheet, *inFile.mVideo);
-	else if (duration)
-		sheet.Add("Milliseconds", TimeText(*duration, span->mRate.mRate, {kTimeDisplay_Milliseconds}));
-	sheet.Add("Audio", AudioDescription(inFile));
-	if (picture && duration)
-		sheet.mItems.emplace_back(DurationTable(*picture, *duration, sound));
-	sheet.mItems.emplace_back(AudioTable(inFile));
+		AddSound(sheet, inFile);
 	return sheet;
 }
 

@@ -11,7 +11,7 @@
 namespace zonmedia
 {
 
-/// The same fields for every file with a picture, and for every file with sound alone; what is not known is null in JSON.
+/// The same fields for every file with video, for every file with sound alone, and for every still picture; what is not known is null in JSON.
 Record MakeSheet(const std::string& inPath, const MediaFile& inFile);
 
 }   // namespace zonmedia

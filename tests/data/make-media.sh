@@ -59,7 +59,38 @@ make -f lavfi -i "$(tones 6 5.1 0.05)" -c:a aac -b:a 128k 5.1.m4a
 make -f lavfi -i "$(tones 2 stereo 1)" -c:a aac -b:a 64k -f adts stereo.aac
 make -f lavfi -i "$(tones 1 mono 0.01)" -c:a pcm_s24le -write_bext 1 -metadata time_reference=1728000000 ten-hours.wav
 
+# Lengths: two seconds of picture beside more sound; a clip whose frames are 1/25 s and then 15/25 s apart
+short="$(plain 64x48 25),trim=duration=2"
+make -f lavfi -i "$short" -f lavfi -i "$(tones 1 mono 10)" -c:v mpeg4 -c:a pcm_s16le short-picture.mkv
+make -f lavfi -i "$short" -f lavfi -i "$(tones 1 mono 3)" -c:v mpeg2video -c:a mp2 -muxrate 60M short-picture.ts
+make -f lavfi -i "$short" -c:v mpeg2video short.mpg
+make -f lavfi -i "$short" -c:v libx264 -g 10 short.mp4
+make -ss 0.6 -i short.mp4 -c copy edited.mp4
+make -f lavfi -i "$(picture 64x48 25),trim=duration=20" -vf "select='lt(n,30)+not(mod(n,15))'" -vsync vfr -c:v libx264 uneven.mp4
+make -i uneven.mp4 -c copy uneven.mkv
+make -i uneven.mp4 -c copy -metadata:s:v NUMBER_OF_FRAMES=62 counted.mkv
+make -f lavfi -i "$short" -c:v rawvideo -pix_fmt uyvy422 raw.avi
+
+# Files that are too large to be read whole, by what players skip; and files whose end is missing
+for file in short-picture.mkv edited.mp4 uneven.mkv uneven.mp4 counted.mkv; do
+	cp "$file" "large-$file"
+	truncate -s 20M "large-$file"
+done
+cut_to() { head -c $(($(wc -c < "$2") * $1 / 100)) "$2" > "cut-$2"; }
+cut_to 75 raw.avi
+cut_to 60 counted.mkv
+cut_to 50 v210-drop.mov   # its index is at its end
+
+# Stills
+for kind in png jpg tiff dpx bmp; do
+	make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 "still.$kind"
+done
+cp still.png still-%03d.png
+
 # No media
 printf 'Notes about a film.\n' > notes.txt
 : > empty.mov
+: > empty.h264
+: > empty.flac
+[ -p pipe ] || mkfifo pipe   # that nobody writes to
 head -c 2000 stereo.aac | tr '\0-\377' 'a-za-za-za-za-za-za-za-z' > letters.bin
