@@ -33,13 +33,14 @@ constexpr char kContextEnd = '\4';
 
 constexpr std::size_t kLargestFile = 64u << 20;
 
-// Bounds-checked reading of a catalogue's bytes.
+// Bounds-checked reading of a catalogue's bytes. Places and sizes come from the file: they are computed in 64 bits, in which
+// nothing that is made of a few words wraps.
 class Bytes
 {
 public:
 	explicit Bytes(std::string_view inBytes) : mBytes(inBytes) {}
 
-	bool Has(std::size_t inAt, std::size_t inCount) const
+	bool Has(std::uint64_t inAt, std::uint64_t inCount) const
 	{
 		return inAt <= mBytes.size() && inCount <= mBytes.size() - inAt;
 	}
@@ -63,7 +64,7 @@ public:
 	{
 		const std::size_t length = Word(inAt);
 		const std::size_t offset = Word(inAt + kWordBytes);
-		if (!Has(offset, length + 1) || mBytes[offset + length] != '\0')
+		if (!Has(offset, std::uint64_t{length} + 1) || mBytes[offset + length] != '\0')
 			return false;
 		outText = mBytes.substr(offset, length);
 		return true;
@@ -85,7 +86,7 @@ std::string_view CheckHeader(Bytes& ioBytes)
 		return "is not a message catalogue: expected the magic number 950412DE";
 	if (ioBytes.Word(kRevisionAt) >> 16 > kLatestMajorRevision)
 		return "is a message catalogue of an unknown revision: expected 0 or 1";
-	const std::size_t tableBytes = std::size_t{ioBytes.Word(kCountAt)} * kEntryBytes;
+	const std::uint64_t tableBytes = std::uint64_t{ioBytes.Word(kCountAt)} * kEntryBytes;
 	if (!ioBytes.Has(ioBytes.Word(kIdTableAt), tableBytes) || !ioBytes.Has(ioBytes.Word(kTextTableAt), tableBytes))
 		return "is a damaged message catalogue: a table of messages lies outside the file";
 	return {};
