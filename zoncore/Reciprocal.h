@@ -10,6 +10,7 @@
 /// Compilers replace a division by a constant by a multiplication; this does the same for a divisor of the program's own,
 /// after T. Granlund and P. Montgomery, "Division by invariant integers using multiplication" (1994).
 
+#include "zoncore/WideInteger.h"
 #include "zoncore/WrappingArithmetic.h"
 
 #include <bit>
@@ -41,8 +42,6 @@ public:
 	friend constexpr bool operator==(const Reciprocal&, const Reciprocal&) noexcept = default;
 
 private:
-	__extension__ using UInt128 = unsigned __int128;
-
 	static constexpr std::uint32_t LogarithmRoundedUp(std::uint64_t inDivisor) noexcept
 	{
 		return static_cast<std::uint32_t>(std::bit_width(inDivisor - 1));
@@ -57,8 +56,8 @@ private:
 			RaiseDivideFault();
 		if (inDivisor == 1)
 			return 0;
-		const UInt128 power = UInt128{1} << (63 + LogarithmRoundedUp(inDivisor));
-		return static_cast<std::uint64_t>((power + inDivisor - 1) / inDivisor);
+		const UInt128 power = UInt128{1u} << (63 + LogarithmRoundedUp(inDivisor));
+		return static_cast<std::uint64_t>((power + (inDivisor - 1)) / inDivisor);
 	}
 
 	std::uint64_t mFactor;

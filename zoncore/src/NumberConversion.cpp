@@ -1,6 +1,7 @@
 #include "zoncore/NumberConversion.h"
 
 #include "zoncore/StringUtils.h"
+#include "zoncore/WideInteger.h"
 
 #include <algorithm>
 #include <array>
@@ -206,13 +207,11 @@ double ReadDecimal(UTF16StringView inText)
 
 constexpr std::int64_t kLargestTerm = 2'147'483'646;
 
-__extension__ using Wide = unsigned __int128;
-
 // The value to come near to, exactly.
 struct Target
 {
-	Wide mNumerator;
-	Wide mDenominator;
+	UInt128 mNumerator;
+	UInt128 mDenominator;
 };
 
 struct Fraction
@@ -227,7 +226,8 @@ Target ExactTarget(double inMagnitude)
 	constexpr int kMantissaBits = 53;
 	int exponent = 0;
 	const double mantissa = std::frexp(inMagnitude, &exponent);
-	return {static_cast<Wide>(std::ldexp(mantissa, kMantissaBits)), Wide{1} << (kMantissaBits - exponent)};
+	return {static_cast<std::uint64_t>(std::ldexp(mantissa, kMantissaBits)),
+		UInt128{1u} << static_cast<unsigned>(kMantissaBits - exponent)};
 }
 
 // The closer of two neighbours on both sides of inTarget, then that with the smaller denominator, then that nearer to
@@ -236,8 +236,8 @@ Fraction Closer(const Target& inTarget, const Fraction& inA, const Fraction& inB
 {
 	const std::int64_t a = inA.mNumerator * inB.mDenominator;
 	const std::int64_t b = inB.mNumerator * inA.mDenominator;
-	const Wide target = inTarget.mNumerator * static_cast<Wide>(2 * inA.mDenominator * inB.mDenominator);
-	const Wide middle = inTarget.mDenominator * static_cast<Wide>(a + b);
+	const UInt128 target = inTarget.mNumerator * static_cast<std::uint64_t>(2 * inA.mDenominator * inB.mDenominator);
+	const UInt128 middle = inTarget.mDenominator * static_cast<std::uint64_t>(a + b);
 	if (target != middle)
 		return (target < middle) == (a < b) ? inA : inB;
 	if (inA.mDenominator != inB.mDenominator)
@@ -260,12 +260,12 @@ Fraction ClosestFraction(const Target& inTarget)
 	Fraction before{0, 1};
 	Fraction last{1, 0};
 	Target rest = inTarget;
-	while (rest.mDenominator != 0)
+	while (rest.mDenominator != 0u)
 	{
-		const Wide quotient = rest.mNumerator / rest.mDenominator;
+		const UInt128 quotient = rest.mNumerator / rest.mDenominator;
 		const std::int64_t steps = MostSteps(before, last);
-		const bool fits = quotient <= static_cast<Wide>(steps);
-		const std::int64_t count = fits ? static_cast<std::int64_t>(quotient) : steps;
+		const bool fits = quotient <= static_cast<std::uint64_t>(steps);
+		const std::int64_t count = fits ? static_cast<std::int64_t>(static_cast<std::uint64_t>(quotient)) : steps;
 		const Fraction next{
 			before.mNumerator + count * last.mNumerator, before.mDenominator + count * last.mDenominator};
 		if (!fits)
