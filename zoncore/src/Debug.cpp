@@ -1,14 +1,11 @@
 #include "zoncore/Debug.h"
 
 #include "zoncore/src/Hook.h"
+#include "zoncore/src/System.h"
 
 #include <algorithm>
 #include <array>
-#include <csignal>
 #include <cstdio>
-#include <fcntl.h>
-#include <string_view>
-#include <unistd.h>
 #include <utility>
 
 namespace zoncore::debug
@@ -89,25 +86,12 @@ bool BreakAfterAssertDialog(std::atomic<bool>& ioDisabled, const char* inConditi
 
 bool IsDebuggerAttached() noexcept
 {
-	// Linux writes the tracer's process number, 0 for none, into a short text about the process.
-	const int file = ::open("/proc/self/status", O_RDONLY | O_CLOEXEC);
-	if (file < 0)
-		return false;
-	char buffer[4096];
-	const ::ssize_t size = ::read(file, buffer, sizeof buffer);
-	::close(file);
-	if (size <= 0)
-		return false;
-	const std::string_view status(buffer, static_cast<std::size_t>(size));
-	constexpr std::string_view kTracer = "\nTracerPid:\t";
-	const auto found = status.find(kTracer);
-	return found != std::string_view::npos && found + kTracer.size() < status.size()
-		&& status[found + kTracer.size()] != '0';
+	return system::IsDebuggerAttached();
 }
 
 void Break() noexcept
 {
-	std::raise(SIGTRAP);
+	system::StopInDebugger();
 }
 
 }   // namespace zoncore::debug

@@ -1,5 +1,6 @@
 #include "zoncore/MessageCatalogue.h"
 
+#include "zoncore/src/System.h"
 #include "zoncore/src/TextKey.h"
 
 #include <algorithm>
@@ -8,7 +9,6 @@
 #include <compare>
 #include <cstdint>
 #include <cstdio>
-#include <cstring>
 #include <memory>
 #include <utility>
 
@@ -115,13 +115,6 @@ std::strong_ordering CompareId(std::string_view inId, std::string_view inContext
 	return inId.substr(contextBytes + 1) <=> inText;
 }
 
-// What the system says of its last error; in English, whatever the process's locale is.
-const char* SystemReason()
-{
-	const char* const reason = ::strerrordesc_np(errno);
-	return reason != nullptr ? reason : "unknown error";
-}
-
 struct CloseFile
 {
 	void operator()(std::FILE* inFile) const { std::fclose(inFile); }
@@ -173,10 +166,10 @@ bool MessageCatalogue::Parse(std::string_view inBytes, std::string& outError)
 
 bool MessageCatalogue::Load(const std::string& inPath, std::string& outError)
 {
-	const std::unique_ptr<std::FILE, CloseFile> file(std::fopen(inPath.c_str(), "rb"));
+	const std::unique_ptr<std::FILE, CloseFile> file(system::OpenToRead(inPath));
 	if (file == nullptr)
 	{
-		outError = inPath + ": cannot be opened: " + SystemReason();
+		outError = inPath + ": cannot be opened: " + system::ErrorText(errno);
 		return false;
 	}
 	std::string bytes;
@@ -192,7 +185,7 @@ bool MessageCatalogue::Load(const std::string& inPath, std::string& outError)
 	}
 	if (std::ferror(file.get()) != 0)
 	{
-		outError = inPath + ": cannot be read: " + SystemReason();
+		outError = inPath + ": cannot be read: " + system::ErrorText(errno);
 		return false;
 	}
 	std::string error;

@@ -2,6 +2,7 @@
 
 #include "zoncore/StringUtils.h"
 #include "zoncore/WideInteger.h"
+#include "zoncore/src/System.h"
 
 #include <algorithm>
 #include <array>
@@ -158,17 +159,22 @@ public:
 	double Scaled(std::int64_t inExponent)
 	{
 		constexpr std::int64_t kHuge = 400;   // beyond every double by far
-		double value = 0;
 		if (inExponent > kHuge)
 			return std::numeric_limits<double>::infinity();
 		if (inExponent < -kHuge)
 			return 0;
 		*mEnd = 'e';
 		const auto exponent = std::to_chars(mEnd + 1, mBuffer.data() + mBuffer.size(), inExponent);
+#if defined(__cpp_lib_to_chars)
+		double value = 0;
 		const auto result = std::from_chars(mBuffer.data(), exponent.ptr, value);
 		if (result.ec == std::errc::result_out_of_range)
 			return inExponent > 0 ? std::numeric_limits<double>::infinity() : 0;
 		return value;
+#else
+		*exponent.ptr = '\0';
+		return system::ReadDouble(mBuffer.data());
+#endif
 	}
 
 private:
@@ -184,7 +190,7 @@ private:
 			mEnd[-1] = '1';
 	}
 
-	std::array<char, kMostDigits + 8> mBuffer;   // "." and "e-400" included
+	std::array<char, kMostDigits + 8> mBuffer;   // ".", "e-400" and an end included
 	char* mEnd = mBuffer.data();
 };
 
