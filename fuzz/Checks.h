@@ -1,6 +1,7 @@
 #pragma once
 
 #include "FuzzInput.h"
+#include "zoncore/SourcePlace.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -12,8 +13,8 @@ namespace zonfuzz
 {
 
 /// Ends the program, for the fuzzer to record the input, when an invariant does not hold.
-inline void Require(
-	bool inCondition, const char* inWhat, const char* inFile = __builtin_FILE(), int inLine = __builtin_LINE())
+inline void Require(bool inCondition, const char* inWhat, const char* inFile = zoncore::debug::SourceFile(),
+	int inLine = zoncore::debug::SourceLine())
 {
 	if (inCondition)
 		return;

@@ -65,13 +65,14 @@ TEST(MessageCatalogue, RefusesDamageAndStaysAsItWas)
 			 {"#!" + sound, "magic number"},
 			 {withWord(4, 0x20000), "unknown revision"},
 			 {withWord(8, 0xFFFFFFFF), "a table of messages lies outside"},
-			 {withWord(8, 0x20000000 + kGerman.size()), "a table of messages lies outside"},   // bytes that wrap at 32 bits
+			 {withWord(8, 0x20000000 + kGerman.size()),
+				 "a table of messages lies outside"},   // bytes that wrap at 32 bits
 			 {withWord(12, 0xFFFFFFF8), "a table of messages lies outside"},
 			 {withWord(16, sound.size() - 4), "a table of messages lies outside"},
 			 {withWord(28 + 8, 0xFFFFFFFF), "message 1 lies outside"},
 			 {withWord(28 + 12, 0xFFFFFFFF), "message 1 lies outside"},
 			 {withWord(28 + 40, 0xFFFFFFFF), "message 5 lies outside"},   // the last one, a zero byte before it
-			 {withWord(28 + 8, 3), "message 1 lies outside"},   // no zero byte behind the text
+			 {withWord(28 + 8, 3), "message 1 lies outside"},             // no zero byte behind the text
 			 {sound.substr(0, sound.size() - 1), "message 5 lies outside"},
 			 {MakeCatalogue({kHeader, {"b", ""}, {"a", ""}}), "message 2 is not in its sorted place"},
 			 {MakeCatalogue({kHeader, {"a", ""}, {"a", ""}}), "sorted"},

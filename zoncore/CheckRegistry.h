@@ -4,9 +4,9 @@
 /// The host's registry of self-checks: libraries register theirs at load, the host lists and runs them.
 
 #include "zoncore/Export.h"
+#include "zoncore/Mutex.h"
 
 #include <functional>
-#include <mutex>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -45,7 +45,7 @@ private:
 		Check mCheck;
 	};
 
-	mutable std::mutex mMutex;
+	mutable threads::Mutex mMutex;
 	std::vector<Entry> mEntries;   // in the order of registration
 };
 

@@ -3,7 +3,7 @@
 /// \file
 /// A mutex that the thread which holds it may lock again.
 
-#include <mutex>
+#include "zoncore/Mutex.h"
 
 namespace zoncore::threads
 {
@@ -20,7 +20,7 @@ public:
 	void Unlock() const noexcept { mMutex.unlock(); }
 
 private:
-	mutable std::recursive_mutex mMutex;
+	mutable StandardRecursiveMutex mMutex;
 };
 
 }   // namespace zoncore::threads

@@ -14,6 +14,7 @@
 /// the stream operators allocates memory, and each is a few instructions.
 
 #include "zoncore/NumberConversion.h"
+#include "zoncore/SourcePlace.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
@@ -126,7 +127,7 @@ public:
 private:
 	/// Reports the violated contract of the operator inSignature; returns when the error reporter does.
 	ZONMEDIATYPES_API static void ReportZeroDivisor(
-		const char* inCondition, const char* inSignature, int inLine = __builtin_LINE());
+		const char* inCondition, const char* inSignature, int inLine = zoncore::debug::SourceLine());
 
 	/// Truncated; a divisor of 0 is a divide fault.
 	constexpr std::int64_t Quotient(std::integral auto inDivisor) const noexcept;

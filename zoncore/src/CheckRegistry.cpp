@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <exception>
 #include <iterator>
+#include <mutex>
 #include <set>
 #include <utility>
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "zoncore/Mutex.h"
+
 #include <atomic>
 #include <functional>
 #include <memory>
@@ -55,7 +57,7 @@ private:
 	struct State
 	{
 		std::atomic<bool> mIsThere = false;
-		mutable std::mutex mMutex;
+		mutable threads::Mutex mMutex;
 		Pointer mValue;
 	};
 	union

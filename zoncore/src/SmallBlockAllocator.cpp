@@ -1,5 +1,7 @@
 #include "zoncore/SmallBlockAllocator.h"
 
+#include "zoncore/Mutex.h"
+
 #include <array>
 #include <cstdint>
 #include <mutex>
@@ -92,7 +94,7 @@ private:
 		return mChunk + mChunkLeft;
 	}
 
-	std::mutex mMutex;
+	threads::Mutex mMutex;
 	BlockList mFree{};
 	std::byte* mChunk = nullptr;
 	std::size_t mChunkLeft = 0;

@@ -1,5 +1,7 @@
 #include "zoncore/src/System.h"
 
+#include "zoncore/Mutex.h"
+
 #include <cstddef>
 #include <cstdlib>
 #include <cstring>
@@ -26,26 +28,26 @@
 	#include <unistd.h>
 #endif
 
-namespace zoncore::system
+namespace zoncore
 {
 
 // ---- Debuggers -------------------------------------------------------------------------------------------------------
 
 #if defined(_WIN32)
 
-bool IsDebuggerAttached() noexcept
+bool system::IsDebuggerAttached() noexcept
 {
 	return ::IsDebuggerPresent() != FALSE;
 }
 
-void StopInDebugger() noexcept
+void system::StopInDebugger() noexcept
 {
 	::DebugBreak();
 }
 
 #elif defined(__APPLE__)
 
-bool IsDebuggerAttached() noexcept
+bool system::IsDebuggerAttached() noexcept
 {
 	int name[] = {CTL_KERN, KERN_PROC, KERN_PROC_PID, ::getpid()};
 	kinfo_proc process{};
@@ -55,7 +57,7 @@ bool IsDebuggerAttached() noexcept
 
 #elif defined(__linux__)
 
-bool IsDebuggerAttached() noexcept
+bool system::IsDebuggerAttached() noexcept
 {
 	// Linux writes the tracer's process number, 0 for none, into a short text about the process.
 	const int file = ::open("/proc/self/status", O_RDONLY | O_CLOEXEC);
@@ -75,7 +77,7 @@ bool IsDebuggerAttached() noexcept
 
 #else
 
-bool IsDebuggerAttached() noexcept
+bool system::IsDebuggerAttached() noexcept
 {
 	return false;
 }
@@ -84,21 +86,21 @@ bool IsDebuggerAttached() noexcept
 
 #if defined(SIGTRAP)
 
-void StopInDebugger() noexcept
+void system::StopInDebugger() noexcept
 {
 	std::raise(SIGTRAP);
 }
 
 #elif !defined(_WIN32)
 
-void StopInDebugger() noexcept
+void system::StopInDebugger() noexcept
 {
 	std::abort();
 }
 
 #endif
 
-void RaiseDivideFault() noexcept
+void system::RaiseDivideFault() noexcept
 {
 #if defined(SIGFPE)
 	std::raise(SIGFPE);
@@ -106,9 +108,27 @@ void RaiseDivideFault() noexcept
 	std::abort();   // a handler of the host's that returns must not resume a division that has no result
 }
 
+// ---- Mutexes ---------------------------------------------------------------------------------------------------------
+
+#if defined(_WIN32)
+
+static_assert(sizeof(::SRWLOCK) == sizeof(void*));
+
+void threads::Mutex::lock() noexcept
+{
+	::AcquireSRWLockExclusive(reinterpret_cast<::SRWLOCK*>(&mState));
+}
+
+void threads::Mutex::unlock() noexcept
+{
+	::ReleaseSRWLockExclusive(reinterpret_cast<::SRWLOCK*>(&mState));
+}
+
+#endif
+
 // ---- Files and errors ------------------------------------------------------------------------------------------------
 
-std::FILE* OpenToRead(const std::string& inPath) noexcept
+std::FILE* system::OpenToRead(const std::string& inPath) noexcept
 {
 #if defined(_WIN32)
 	try
@@ -126,7 +146,7 @@ std::FILE* OpenToRead(const std::string& inPath) noexcept
 #endif
 }
 
-std::string ErrorText(int inError)
+std::string system::ErrorText(int inError)
 {
 #if defined(__GLIBC__)
 	const char* const text = ::strerrordesc_np(inError);
@@ -142,7 +162,7 @@ std::string ErrorText(int inError)
 
 // ---- Numbers ---------------------------------------------------------------------------------------------------------
 
-double ReadDouble(const char* inText) noexcept
+double system::ReadDouble(const char* inText) noexcept
 {
 	#if defined(_WIN32)
 	static const ::_locale_t sClassic = ::_create_locale(LC_ALL, "C");
@@ -157,4 +177,4 @@ double ReadDouble(const char* inText) noexcept
 
 #endif   // __cpp_lib_to_chars
 
-}   // namespace zoncore::system
+}   // namespace zoncore

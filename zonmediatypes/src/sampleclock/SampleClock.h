@@ -1,6 +1,7 @@
 #pragma once
 
 #include "zoncore/Debug.h"
+#include "zoncore/SourcePlace.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/src/TextWriter.h"
 
@@ -77,7 +78,7 @@ inline double Fraction(double inValue) noexcept
 /// attached debugger when the dialog asks for that. Hosts know these places by the file of the conversions' entry
 /// points.
 inline void ReportMisuse(std::atomic<bool>& ioDisabled, const char* inCondition, const char* inMessage,
-	const char* inFunction, int inLine = __builtin_LINE())
+	const char* inFunction, int inLine = zoncore::debug::SourceLine())
 {
 	const bool wantsBreak = zoncore::debug::BreakAfterAssertDialog(
 		ioDisabled, inCondition, inMessage, "zonmediatypes/src/TimeConversionUtils.cpp", inLine, inFunction, true);

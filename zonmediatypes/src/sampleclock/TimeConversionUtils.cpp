@@ -93,7 +93,8 @@ constexpr const FormatRow& FindFormat(TimecodeFormat inFormat)
 	return sFormats[inFormat < sFormats.size() ? inFormat : kTimecodeFormat_None];
 }
 
-bool ReportMissingBeatInfo(std::atomic<bool>& ioDisabled, const char* inFunction, int inLine = __builtin_LINE())
+bool ReportMissingBeatInfo(
+	std::atomic<bool>& ioDisabled, const char* inFunction, int inLine = zoncore::debug::SourceLine())
 {
 	ReportMisuse(ioDisabled, "inBeatInfo", "programmer error!\n", inFunction, inLine);
 	return false;
