@@ -89,7 +89,7 @@ void CheckReading(FuzzInput& ioInput)
 
 // The text of a number made of what printf writes. Beyond 1,100 decimals a double has zeros only; texts of that many
 // digits are longer than all that are asked for here.
-std::string Expected(double inValue, unsigned long inDigits, unsigned long inDecimals, unsigned inFlags, int inLength)
+std::string Expected(double inValue, std::size_t inDigits, std::size_t inDecimals, unsigned inFlags, int inLength)
 {
 	if (std::isnan(inValue))
 		return "nan";
@@ -97,10 +97,11 @@ std::string Expected(double inValue, unsigned long inDigits, unsigned long inDec
 		return inValue < 0 ? "-inf" : "inf";
 	const ClassicNumbers classic;
 	char buffer[1'500];
-	std::snprintf(buffer, sizeof buffer, "%.*f", static_cast<int>(std::min(inDecimals, 1'100ul)), std::abs(inValue));
+	std::snprintf(
+		buffer, sizeof buffer, "%.*f", static_cast<int>(std::min(inDecimals, std::size_t{1'100})), std::abs(inValue));
 	std::string text = buffer;
 	const std::size_t wholeDigits = std::min(text.find('.'), text.size());
-	text.insert(0, std::max(std::min(inDigits, 400ul), wholeDigits) - wholeDigits, '0');
+	text.insert(0, std::max(std::min(inDigits, std::size_t{400}), wholeDigits) - wholeDigits, '0');
 	if ((inFlags & kNumberFlag_DropTrailingZeros) != 0 && text.find('.') != std::string::npos)
 	{
 		text.erase(text.find_last_not_of('0') + 1);
@@ -131,8 +132,8 @@ void CheckRoundTrip(FuzzInput& ioInput)
 void CheckWriting(FuzzInput& ioInput)
 {
 	const double value = TakeDouble(ioInput);
-	const auto digits = ioInput.Edge<unsigned long>();
-	const auto decimals = ioInput.Edge<unsigned long>();
+	const auto digits = static_cast<std::size_t>(ioInput.Edge<std::uint64_t>());
+	const auto decimals = static_cast<std::size_t>(ioInput.Edge<std::uint64_t>());
 	const auto flags = ioInput.Any<unsigned short>();
 	const int length = ioInput.Any<std::int8_t>();
 	Require(UTF16to8(NumberToString(value, digits, decimals, flags, length))

@@ -113,7 +113,7 @@ TEST(IdentityMatrix, IsCutOrPadded)
 	EXPECT_EQ(matrix, (ChannelConversionMatrix{{1, 0}, {0, 1}, {0, 0}}));
 	CreateIdentityChannelConversionMatrix(3, 2, matrix);
 	EXPECT_EQ(matrix, (ChannelConversionMatrix{{1, 0, 0}, {0, 1, 0}}));
-	CreateIdentityChannelConversionMatrix(std::numeric_limits<unsigned long>::max(), 0, matrix);
+	CreateIdentityChannelConversionMatrix(std::numeric_limits<std::size_t>::max(), 0, matrix);
 	EXPECT_EQ(matrix, ChannelConversionMatrix());
 }
 

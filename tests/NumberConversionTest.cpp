@@ -79,7 +79,7 @@ double ReadAsStrtod(const std::string& inText)
 // ---- Numbers to text -------------------------------------------------------------------------------------------------
 
 std::string Format(
-	double inValue, unsigned long inDigits, unsigned long inDecimals, unsigned short inFlags = 0, int inLength = 31)
+	double inValue, std::size_t inDigits, std::size_t inDecimals, unsigned short inFlags = 0, int inLength = 31)
 {
 	return UTF16to8(NumberToString(inValue, inDigits, inDecimals, inFlags, inLength));
 }
@@ -100,11 +100,11 @@ TEST(NumberToString, RoundsAsTheCLibraryDoes)
 		std::string fixed = Print(std::abs(value), std::ios_base::fixed, i % 12);
 		if (value < 0 && fixed.find_first_not_of("0.") != std::string::npos)
 			fixed.insert(0, "-");
-		ASSERT_EQ(Format(value, 1, static_cast<unsigned long>(i % 12), 0, 400), fixed);
+		ASSERT_EQ(Format(value, 1, static_cast<std::size_t>(i % 12), 0, 400), fixed);
 		ASSERT_EQ(Format(value, 1, 0, 0, 0), Print(value, {}, 6));
 	}
 	EXPECT_EQ(Format(-0x1p1023, 1, 2'000, 0, 2'310), Print(-0x1p1023, std::ios_base::fixed, 2'000));
-	EXPECT_EQ(Format(0x1p-1074, 1, ULONG_MAX, 4, INT_MAX), Print(0x1p-1074, std::ios_base::fixed, 1'074));
+	EXPECT_EQ(Format(0x1p-1074, 1, SIZE_MAX, 4, INT_MAX), Print(0x1p-1074, std::ios_base::fixed, 1'074));
 }
 
 TEST(NumberToString, DropsZerosPadsAndChangesTheNotationOfLongText)
@@ -126,11 +126,11 @@ TEST(NumberToString, DropsZerosPadsAndChangesTheNotationOfLongText)
 	EXPECT_EQ(Format(1, 3, 1'075, 0, 1'078) + " " + Format(1, 1, 1'075, 0, 1'076), "1 1");   // one character less each
 	EXPECT_EQ(Format(0.5, 1, 0, 0, INT_MIN), "0.5");
 	// Counts that no memory holds, and sums of counts that wrap
-	for (const unsigned long digits : {1ul, ULONG_MAX - 2, ULONG_MAX})
-		for (const unsigned long decimals : {ULONG_MAX - 1, ULONG_MAX, 0x80000000ul})
+	for (const std::size_t digits : {std::size_t{1}, SIZE_MAX - 2, SIZE_MAX})
+		for (const std::size_t decimals : {SIZE_MAX - 1, SIZE_MAX, std::size_t{0x80000000}})
 			EXPECT_EQ(Format(1.5, digits, decimals), "1.5");
-	EXPECT_EQ(Format(1.5, ULONG_MAX, 0, 0, INT_MAX), "1.5");
-	EXPECT_EQ(Format(1.5, 5, ULONG_MAX, kNumberFlag_DropTrailingZeros), "00001.5");
+	EXPECT_EQ(Format(1.5, SIZE_MAX, 0, 0, INT_MAX), "1.5");
+	EXPECT_EQ(Format(1.5, 5, SIZE_MAX, kNumberFlag_DropTrailingZeros), "00001.5");
 }
 
 // ---- Text to numbers -------------------------------------------------------------------------------------------------

@@ -25,7 +25,7 @@ template <class Stream>
 Stream WriteEverything(Stream ioStream)
 {
 	const auto fill = [](char inChar) { return std::setfill(static_cast<typename Stream::char_type>(inChar)); };
-	ioStream << 0 << " " << -1 << " " << 1'234'567 << " " << std::numeric_limits<unsigned long>::max() << std::endl;
+	ioStream << 0 << " " << -1 << " " << 1'234'567 << " " << std::numeric_limits<std::uint64_t>::max() << std::endl;
 	ioStream << std::numeric_limits<long long>::min() << std::setw(6) << 42 << std::setw(6) << -4.5 << "\n";
 	ioStream << 0.0 << " " << -0.0 << " " << 29.97 << " " << 1e6 << " " << 1234567.0 << " " << 1e-5 << "\n";
 	ioStream << std::numeric_limits<double>::infinity() << std::numeric_limits<float>::quiet_NaN() << "\n";

@@ -11,6 +11,7 @@
 #include <boost/rational.hpp>
 #include <charconv>
 #include <concepts>
+#include <cstddef>
 #include <cstdint>
 #include <limits>
 
@@ -38,7 +39,7 @@ inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
 /// ("1.79769e+308"). Infinities are "inf" and "-inf", NaN is "nan".
 ///
 /// Counts of any size are legal: text that no memory holds is longer than inMaxLength. The result is what is allocated.
-ZONCORE_API UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, unsigned long inDecimals,
+ZONCORE_API UTF16String NumberToString(double inValue, std::size_t inMinIntegerDigits, std::size_t inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength);
 
 /// inValue in decimal digits, with "-" before a negative one.

@@ -11,6 +11,8 @@
 #include "zonmediatypes/AudioChannelLabel.h"
 #include "zonmediatypes/Export.h"
 
+#include <cstddef>
+
 namespace zonmediatypes
 {
 
@@ -21,12 +23,12 @@ using ChannelConversionMatrix
 	= zoncore::utility::SmallBlockAllocator::vector<zoncore::utility::SmallBlockAllocator::vector<double>>;
 
 /// For each destination channel the index of the source channel that feeds it.
-using ChannelOrdering = zoncore::utility::SmallBlockAllocator::vector<unsigned long>;
+using ChannelOrdering = zoncore::utility::SmallBlockAllocator::vector<std::size_t>;
 
 /// Feeds each destination channel from the source channel of the same index; what is left over on either side is silent.
 /// Without destination channels the matrix is empty.
 ZONMEDIATYPES_API void CreateIdentityChannelConversionMatrix(
-	unsigned long inSourceChannelCount, unsigned long inDestinationChannelCount, ChannelConversionMatrix& outMatrix);
+	std::size_t inSourceChannelCount, std::size_t inDestinationChannelCount, ChannelConversionMatrix& outMatrix);
 
 /// The matrix that routes inSource into inDestination by label, in time and memory in proportion to the product of the
 /// channel counts. Each destination channel takes what the first line that fits it says:

@@ -15,6 +15,7 @@
 #include "zonmediatypes/Export.h"
 
 #include <compare>
+#include <cstddef>
 #include <cstdint>
 #include <span>
 
@@ -138,6 +139,6 @@ ZONMEDIATYPES_API bool ContainsSameChannelsIgnoreOrder(
 	const AudioChannelLayout& inFirst, const AudioChannelLayout& inSecond);
 
 /// The channels of all layouts together.
-ZONMEDIATYPES_API unsigned long GetChannelCount(const AudioChannelLayouts& inLayouts) noexcept;
+ZONMEDIATYPES_API std::size_t GetChannelCount(const AudioChannelLayouts& inLayouts) noexcept;
 
 }   // namespace zonmediatypes

@@ -10,6 +10,7 @@
 #include "zonmediatypes/AudioChannelLabel.h"
 #include "zonmediatypes/Export.h"
 
+#include <cstddef>
 #include <span>
 #include <string_view>
 
@@ -31,7 +32,7 @@ ZONMEDIATYPES_API AudioChannelLayout CreateMultichannelLayout(int inCount);
 
 /// The usual layout of 1, 2, 4, 6 or 8 channels: mono, stereo, quadraphonic, broadcast 5.1, 7.1 ITU. Any other count gives
 /// `Discrete` channels, as many as its low 32 bits say as a signed number: none when those are negative.
-ZONMEDIATYPES_API AudioChannelLayout CreateMultichannelLayoutWithDefaultLabels(unsigned long inCount);
+ZONMEDIATYPES_API AudioChannelLayout CreateMultichannelLayoutWithDefaultLabels(std::size_t inCount);
 
 // The fixed layouts by channel count. Where a factory's name does not list its labels in order, a comment does, * for
 // Discrete. Two of them hold a channel more than their names list (Tbc), and the SMPTE digital cinema layouts fill up to 16

@@ -35,10 +35,10 @@ UTF16String GeneralText(double inValue)
 }
 
 // The digits of inMagnitude, rounded; no more decimals than a double can have.
-std::string_view FixedText(double inMagnitude, unsigned long inDecimals, std::span<char, kLongestFixedText> outBuffer)
+std::string_view FixedText(double inMagnitude, std::size_t inDecimals, std::span<char, kLongestFixedText> outBuffer)
 {
 	char* const begin = outBuffer.data();
-	const auto decimals = static_cast<int>(std::min<unsigned long>(inDecimals, kMostDecimals));
+	const auto decimals = static_cast<int>(std::min<std::size_t>(inDecimals, kMostDecimals));
 	const auto result = std::to_chars(begin, begin + outBuffer.size(), inMagnitude, std::chars_format::fixed, decimals);
 	return {begin, result.ptr};
 }
@@ -284,7 +284,7 @@ Fraction ClosestFraction(const Target& inTarget)
 
 }   // namespace
 
-UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, unsigned long inDecimals,
+UTF16String NumberToString(double inValue, std::size_t inMinIntegerDigits, std::size_t inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength)
 {
 	if (std::isnan(inValue))
@@ -298,8 +298,8 @@ UTF16String NumberToString(double inValue, unsigned long inMinIntegerDigits, uns
 	const std::string_view digits = keepsZeros ? fixed : WithoutTrailingZeros(fixed);
 	const bool isNegative = inValue < 0 && digits.find_first_not_of("0.") != std::string_view::npos;
 	const std::size_t integerDigits = std::min(digits.find('.'), digits.size());
-	const unsigned long moreDigits = inMinIntegerDigits > integerDigits ? inMinIntegerDigits - integerDigits : 0;
-	const unsigned long moreDecimals = keepsZeros && inDecimals > kMostDecimals ? inDecimals - kMostDecimals : 0;
+	const std::size_t moreDigits = inMinIntegerDigits > integerDigits ? inMinIntegerDigits - integerDigits : 0;
+	const std::size_t moreDecimals = keepsZeros && inDecimals > kMostDecimals ? inDecimals - kMostDecimals : 0;
 
 	// Compared piece by piece: the counts come from the caller and their sum could wrap.
 	const std::size_t maxLength = inMaxLength < 0 ? 0 : static_cast<std::size_t>(inMaxLength);

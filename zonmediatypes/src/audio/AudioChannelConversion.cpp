@@ -187,7 +187,7 @@ bool HasLabelsToGoBy(const AudioChannelLayout& inSource, const AudioChannelLayou
 }   // namespace
 
 void CreateIdentityChannelConversionMatrix(
-	unsigned long inSourceChannelCount, unsigned long inDestinationChannelCount, ChannelConversionMatrix& outMatrix)
+	std::size_t inSourceChannelCount, std::size_t inDestinationChannelCount, ChannelConversionMatrix& outMatrix)
 {
 	ChannelConversionMatrix matrix = SilentMatrix(inSourceChannelCount, inDestinationChannelCount);
 	for (std::size_t i = 0; i < std::min(inSourceChannelCount, inDestinationChannelCount); ++i)

@@ -129,10 +129,10 @@ bool ContainsSameChannelsIgnoreOrder(const AudioChannelLayout& inFirst, const Au
 	return first == second;
 }
 
-unsigned long GetChannelCount(const AudioChannelLayouts& inLayouts) noexcept
+std::size_t GetChannelCount(const AudioChannelLayouts& inLayouts) noexcept
 {
 	return std::accumulate(inLayouts.begin(), inLayouts.end(), 0ul,
-		[](unsigned long inSum, const AudioChannelLayout& inLayout) { return inSum + inLayout.size(); });
+		[](std::size_t inSum, const AudioChannelLayout& inLayout) { return inSum + inLayout.size(); });
 }
 
 }   // namespace zonmediatypes

@@ -232,7 +232,7 @@ AudioChannelLayout CreateMultichannelLayout(int inCount)
 	return AudioChannelLayout(static_cast<std::size_t>(std::max(inCount, 0)));
 }
 
-AudioChannelLayout CreateMultichannelLayoutWithDefaultLabels(unsigned long inCount)
+AudioChannelLayout CreateMultichannelLayoutWithDefaultLabels(std::size_t inCount)
 {
 	auto layout = DefaultLayoutOf(inCount, DefaultFor::Layouts);
 	return layout ? *std::move(layout)

@@ -84,8 +84,7 @@ constexpr auto sFormats = std::to_array<FormatRow>({
 	{kTimecodeFormat_TimecodeNTSCAlt2,     TextKind::Timecode, {.mNTSC = true}},
 });
 // clang-format on
-static_assert(
-	std::ranges::all_of(sFormats, [](const FormatRow& inRow) { return &inRow - sFormats.data() == inRow.mFormat; }));
+static_assert(std::ranges::all_of(sFormats, [](const FormatRow& inRow) { return &inRow == &sFormats[inRow.mFormat]; }));
 
 // The row of a format; that of None for a number that is no format.
 constexpr const FormatRow& FindFormat(TimecodeFormat inFormat)

@@ -5,6 +5,7 @@
 #include "zonmediatypes/src/time/RateText.h"
 
 #include <array>
+#include <cstddef>
 #include <string>
 
 namespace zonmediatypes
@@ -55,7 +56,7 @@ double WrittenFramesPerSecond(FrameRate inRate)
 // Two decimals tell all named rates apart but 23.976 and 24 fps, which people know by three.
 UTF16String RateText(FrameRate inRate)
 {
-	constexpr unsigned long kMinIntegerDigits = 1;
+	constexpr std::size_t kMinIntegerDigits = 1;
 	constexpr int kMaxLength = 31;
 	return zoncore::utility::NumberToString(WrittenFramesPerSecond(inRate), kMinIntegerDigits,
 		inRate == kFrameRate_23976 ? 3 : 2, zoncore::utility::kNumberFlag_DropTrailingZeros, kMaxLength);

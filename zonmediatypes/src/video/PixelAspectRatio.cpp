@@ -4,6 +4,7 @@
 #include "zoncore/StringUtils.h"
 
 #include <array>
+#include <cstddef>
 
 namespace zonmediatypes
 {
@@ -41,7 +42,7 @@ constexpr bool IsHalfOrWhole(PixelAspectRatio inRatio)
 
 UTF16String RatioText(PixelAspectRatio inRatio)
 {
-	constexpr unsigned long kMinIntegerDigits = 1;
+	constexpr std::size_t kMinIntegerDigits = 1;
 	constexpr unsigned short kNoFlags = 0;
 	constexpr int kMaxLength = 31;
 	return zoncore::utility::NumberToString(
