@@ -7,10 +7,17 @@
 
 #include <mutex>
 
+/// Whether programs for this system have threads at all.
+#if defined(__wasm__) && !defined(_REENTRANT)
+	#define ZONCORE_HAS_THREADS 0
+#else
+	#define ZONCORE_HAS_THREADS 1
+#endif
+
 namespace zoncore::threads
 {
 
-#if defined(__wasm__) && !defined(_REENTRANT)
+#if !ZONCORE_HAS_THREADS
 
 /// A program with one thread has nothing to lock.
 class Mutex

@@ -4,13 +4,13 @@
 #include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/src/video/PerfectIndex.h"
 #include "zonmediatypes/src/video/PixelFormatFacts.h"
+#include "zonmediatypes/src/video/RegistryMutex.h"
 
 #include <algorithm>
 #include <array>
-#include <boost/thread/lock_guard.hpp>
-#include <boost/thread/mutex.hpp>
 #include <cstddef>
 #include <cstdint>
+#include <mutex>
 #include <string_view>
 
 // The facts' own short words, in this file only.
@@ -179,7 +179,7 @@ public:
 		// Memory is taken and given back without the lock, since that may take a lock of its own.
 		Registry added;
 		added.emplace(inName, inProperties);
-		const boost::lock_guard<boost::mutex> lock(mMutex);
+		const std::lock_guard lock(mMutex);
 		mRegistry.merge(added);
 		if (!added.empty())
 			mRegistry.find(inName)->second = inProperties;
@@ -187,7 +187,7 @@ public:
 
 	PixelFormatProperties Lookup(unsigned int inName) const
 	{
-		const boost::lock_guard<boost::mutex> lock(mMutex);
+		const std::lock_guard lock(mMutex);
 		const auto found = mRegistry.find(inName);
 		return found == mRegistry.end() ? kPixelFormatProperties_Invalid : found->second;
 	}
@@ -195,7 +195,7 @@ public:
 private:
 	using Registry = zoncore::utility::SmallBlockAllocator::map<unsigned int, PixelFormatProperties>;
 
-	mutable boost::mutex mMutex;
+	mutable RegistryMutex mMutex;
 	Registry mRegistry;
 };
 
