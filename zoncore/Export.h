@@ -3,6 +3,8 @@
 /// \file
 /// ZONCORE_API marks what zoncore exports: everything else stays hidden in the shared library.
 
+#include "zoncore/Requirements.h"
+
 #if defined(ZONCORE_STATIC)
 	#define ZONCORE_API
 #elif defined(_WIN32) && defined(ZONCORE_BUILDING)

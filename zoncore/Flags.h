@@ -3,6 +3,8 @@
 /// \file
 /// A set of bit flags over an unsigned integer.
 
+#include "zoncore/Requirements.h"
+
 #include <concepts>
 
 namespace zoncore

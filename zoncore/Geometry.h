@@ -3,6 +3,8 @@
 /// \file
 /// Points and rectangles as plain aggregates.
 
+#include "zoncore/Requirements.h"
+
 namespace zoncore
 {
 

@@ -4,6 +4,8 @@
 /// ZONMEDIATYPES_API marks what zonmediatypes exports: everything else stays hidden in the shared library. Of a class that
 /// is marked whole, ZONMEDIATYPES_INTERNAL hides a member that only the library calls.
 
+#include "zoncore/Requirements.h"
+
 #if defined(ZONMEDIATYPES_STATIC)
 	#define ZONMEDIATYPES_API
 #elif defined(_WIN32) && defined(ZONMEDIATYPES_BUILDING)

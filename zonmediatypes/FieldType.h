@@ -3,6 +3,8 @@
 /// \file
 /// The order of the fields of interlaced video.
 
+#include "zoncore/Requirements.h"
+
 #include <cstdint>
 
 namespace zonmediatypes

@@ -17,6 +17,8 @@
 /// Every 32-bit value is a legal one and is kept as it is, unassigned codes and unused bits included; comparison sees all
 /// 32 bits.
 
+#include "zoncore/Requirements.h"
+
 #include <cstdint>
 
 namespace zonmediatypes

@@ -16,6 +16,15 @@ zon_target_defaults(PublicHeaders)
 target_compile_options(PublicHeaders PRIVATE -O0)
 target_link_libraries(PublicHeaders PRIVATE zonmediatypes::zonmediatypes)
 
+# As C++17 each says in one message what it needs. The compilers that are asked are of the kind that knows these options.
+if(NOT MSVC)
+	set(testedHeaders ${publicHeaders})
+	list(FILTER testedHeaders EXCLUDE REGEX "/interop/|/SourcePlace\\.h$")
+	add_test(NAME Adoption.OneMessageForCxx17 COMMAND ${CMAKE_COMMAND} "-DCOMPILER=${CMAKE_CXX_COMPILER}"
+		"-DINCLUDES=-I${zonmediatypes_SOURCE_DIR};-I${zonmediatypes_BINARY_DIR}/include" "-DHEADERS=${testedHeaders}"
+		"-DSCRATCH=${CMAKE_CURRENT_BINARY_DIR}/headers/Cxx17.cpp" -P "${CMAKE_CURRENT_SOURCE_DIR}/adoption/CheckStandard.cmake")
+endif()
+
 # Installed or fetched, shared or static, found in three ways.
 if(BUILD_SHARED_LIBS AND ZON_INSTALL)
 	function(zon_add_adoption_test inWay)
