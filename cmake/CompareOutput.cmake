@@ -1,11 +1,12 @@
 # Runs a program and fails unless it succeeds and writes exactly what a file holds.
-#   cmake -DPROGRAM=... [-DARGUMENT=...] -DEXPECTED=FILE -P CompareOutput.cmake
-# With -DUPDATE=ON the file is written instead.
+#   cmake -DPROGRAM=... [-DARGUMENT=...] [-DEMULATOR=...] -DEXPECTED=FILE -P CompareOutput.cmake
+# With -DUPDATE=ON the file is written instead. The emulator, if there is one, is a command that runs the program.
 
-execute_process(COMMAND "${PROGRAM}" ${ARGUMENT} OUTPUT_VARIABLE output RESULT_VARIABLE status)
+execute_process(COMMAND ${EMULATOR} "${PROGRAM}" ${ARGUMENT} OUTPUT_VARIABLE output RESULT_VARIABLE status)
 if(NOT status EQUAL 0)
 	message(FATAL_ERROR "${PROGRAM} ${ARGUMENT} ended with ${status}")
 endif()
+string(REPLACE "\r\n" "\n" output "${output}")   # as Windows ends lines
 if(UPDATE)
 	file(WRITE "${EXPECTED}" "${output}")
 	return()

@@ -14,7 +14,8 @@ endif()
 foreach(library IN ITEMS zoncore zonmediatypes)
 	install(TARGETS ${library} EXPORT ${library}Targets
 		LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}" COMPONENT runtime NAMELINK_COMPONENT development
-		ARCHIVE DESTINATION "${CMAKE_INSTALL_LIBDIR}" COMPONENT development)
+		ARCHIVE DESTINATION "${CMAKE_INSTALL_LIBDIR}" COMPONENT development
+		RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}" COMPONENT runtime)   # a DLL
 	install(EXPORT ${library}Targets NAMESPACE ${library}:: FILE ${library}-${linkage}-targets.cmake
 		DESTINATION "${package}" COMPONENT development)
 	install(DIRECTORY "${zonmediatypes_SOURCE_DIR}/${library}/" DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}/${library}"
@@ -34,6 +35,7 @@ install(FILES "${generated}/zonmediatypesConfig.cmake" "${generated}/zonmediatyp
 # The .pc files find the prefix from where they lie, so that an installation can be moved.
 file(RELATIVE_PATH prefixFromPkgConfig "/prefix/${CMAKE_INSTALL_LIBDIR}/pkgconfig" /prefix)
 string(REGEX REPLACE "/$" "" prefixFromPkgConfig "${prefixFromPkgConfig}")
+list(JOIN ZON_PUBLIC_OPTIONS " " ZON_PUBLIC_OPTIONS_TEXT)
 foreach(library IN ITEMS zoncore zonmediatypes)
 	configure_file("${CMAKE_CURRENT_LIST_DIR}/${library}.pc.in" "${generated}/${library}.pc" @ONLY)
 	install(FILES "${generated}/${library}.pc" DESTINATION "${CMAKE_INSTALL_LIBDIR}/pkgconfig" COMPONENT development)
@@ -46,7 +48,7 @@ install(FILES "${zonmediatypes_SOURCE_DIR}/tools/gdb/zonmediatypes.py"
 
 if(TARGET zonmedia)
 	file(RELATIVE_PATH librariesFromPrograms "/prefix/${CMAKE_INSTALL_BINDIR}" "/prefix/${CMAKE_INSTALL_LIBDIR}")
-	set_target_properties(zonmedia PROPERTIES INSTALL_RPATH "$ORIGIN/${librariesFromPrograms}")
+	set_target_properties(zonmedia PROPERTIES INSTALL_RPATH "${ZON_ORIGIN}/${librariesFromPrograms}")
 	install(TARGETS zonmedia RUNTIME DESTINATION "${CMAKE_INSTALL_BINDIR}" COMPONENT companion)
 	install(FILES "${zonmediatypes_SOURCE_DIR}/zonmedia/completion.bash"
 		DESTINATION "${CMAKE_INSTALL_DATADIR}/bash-completion/completions" RENAME zonmedia COMPONENT companion)

@@ -1,0 +1,13 @@
+# WebAssembly with the system interface WASI: clang 19 with Debian's wasi-libc and libc++-19-dev-wasm32; node runs the
+# programs. There are no threads there, no shared libraries, and an exception that is thrown ends the program.
+set(CMAKE_SYSTEM_NAME WASI)
+set(CMAKE_SYSTEM_PROCESSOR wasm32)
+set(CMAKE_CXX_COMPILER clang++-19)
+set(CMAKE_CXX_COMPILER_TARGET wasm32-wasi)
+set(CMAKE_AR llvm-ar-19)
+set(CMAKE_RANLIB llvm-ranlib-19)
+set(CMAKE_EXECUTABLE_SUFFIX .wasm)
+set(CMAKE_CROSSCOMPILING_EMULATOR node;--no-warnings;${CMAKE_CURRENT_LIST_DIR}/run-wasi.mjs)
+set(ZONCORE_SMALL_BLOCK_POOL OFF CACHE BOOL "")
+set(BUILD_SHARED_LIBS OFF CACHE BOOL "")
+include("${CMAKE_CURRENT_LIST_DIR}/CrossCompiling.cmake")
