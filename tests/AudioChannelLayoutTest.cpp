@@ -51,79 +51,46 @@ TEST(LabelPairs, AreTheRequiredOnes)
 
 // ---- Catalogue of layouts --------------------------------------------------------------------------------------------
 
-struct RequiredLayout
+std::string ReadFile(const std::string& inPath)
 {
-	std::string mFactory;
-	AudioChannelLayout (*mCreate)();
-	std::string mLabels;
-};
+	std::ostringstream text;
+	text << std::ifstream(inPath).rdbuf();
+	return text.str();
+}
 
-// The layouts that are called after what they are for; the names of the others are their labels: "_L_R_C_".
-// clang-format off
-#define ROW(inFactory, inLabels) {#inFactory, inFactory, inLabels}
-const std::vector<RequiredLayout> sRequiredLayouts = {
-	ROW(CreateMonoChannelLayout, "*"),
-	ROW(CreateStereoChannelLayout, "L R"),
-	ROW(Create51ChannelLayout, "L R C LFE Ls Rs"),
-	ROW(CreateBroadcast51ChannelLayout, "L R C LFE Ls Rs"),
-	ROW(CreateLegacy51ChannelLayout, "L R Ls Rs C LFE"),
-	ROW(CreateQuadraphonicChannelLayout, "L R Ls Rs"),
-	ROW(Create7_1ItuChannelLayout, "L R C LFE Ls Rs Rls Rrs"),
-	ROW(CreateMatrixStereoChannelLayout, "Lt Rt"),
-	ROW(CreateAmbisonicsBFormatChannelLayout, "W X Y Z"),
-	ROW(CreatePentagonalChannelLayout, "L R Ls Rs C"),
-	ROW(CreateHexagonalChannelLayout, "L R Ls Rs C Cs"),
-	ROW(Create7_1ChannelLayout, "L R C LFE Ls Rs Lc Rc"),
-	ROW(Create7_1MpegChannelLayout, "C Lc Rc L R Ls Rs LFE"),
-	ROW(Create7_1EMagicChannelLayout, "L R Ls Rs C LFE Lc Rc"),
-	ROW(CreateSmpteDtvChannelLayout, "L R C LFE Ls Rs Lt Rt"),
-	ROW(CreateOctagonalChannelLayout, "L R Ls Rs C Cs Lsd Rsd"),
-	ROW(CreateCubeChannelLayout, "L R Ls Rs Vhl Vhr Tbl Tbr"),
-	ROW(CreateVST10_2ChannelLayout, "L R C LFE Ls Rs Vhl Vhc Vhr Tbl Tbr LFE2"),
-	ROW(Create_L_R_C_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
-	ROW(CreateVST10_2_PlusChannelLayout, "L R C LFE Ls Rs Lc Rc Vhl Vhc Vhr Tbl Tbr LFE2"),
-	ROW(Create_L_R_C_LFE_Ls_Rs_Cs_Ts_Vhl_Vhc_Vhr_Tbl_Tbr_ChannelLayout, "L R C LFE Ls Rs Cs Ts Vhl Vhc Vhr Tbl Tbc Tbr"),
-	ROW(CreateVST22_2ChannelLayout, "L R C LFE Ls Rs Lc Rc Cs Lsd Rsd Ts Vhl Vhc Vhr Tbl Tbc Tbr LFE2 Tsl Tsr Bfl Bfc Bfr"),
-	ROW(Create_VST_7_1_Cine_Top_Center_Layout, "L R C LFE Ls Rs Cs Ts"),
-	ROW(Create_VST_7_1_Cine_Center_High_Layout, "L R C LFE Ls Rs Cs Vhc"),
-	ROW(Create_VST_7_1_Cine_Front_High_Layout, "L R C LFE Ls Rs Vhl Vhr"),
-	ROW(Create_VST_7_1_Cine_Side_High_Layout, "L R C LFE Ls Rs Tsl Tsr"),
-	ROW(CreateSMPTEDigitalCinema1Channel, "* * C * * * * * * * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema2Channel, "Lt Rt * * * * * * * * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema4Channel, "L R C * Cs * * * * * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema6Channel, "L R C LFE Ls Rs * * * * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema7Channel, "L R C LFE Ls Rs * * Cs * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema8Channel, "L R C LFE Ls Rs Lc Rc * * * * * * * *"),
-	ROW(CreateSMPTEDigitalCinema9Channel, "L R C LFE Ls Rs Lc Rc Cs * * * * * * *"),
-};
-#undef ROW
-// clang-format on
-
-TEST(ChannelLayouts, AreTheRequiredOnes)
+TEST(ChannelLayouts, AreThePublishedTable)
 {
-	EXPECT_EQ(AllChannelLayouts().size(), 89u);
-	for (const auto& [name, labels] : AllChannelLayouts())
+	std::istringstream table(ReadFile(ZON_TEST_DATA "/channel-layouts.tsv"));
+	const std::string header = ReadFile(ZON_TEST_DATA "/../../zonmediatypes/AudioChannelLayoutCatalogue.h");
+	std::string factory, channels, labels;
+	std::getline(table, labels);   // headings
+	for (const NamedChannelLayout& layout : AllChannelLayouts())
 	{
-		const auto required = std::ranges::find_if(sRequiredLayouts,
-			[factory = "Create" + std::string(name)](const RequiredLayout& inLayout)
-			{ return inLayout.mFactory == factory || inLayout.mFactory == factory + "ChannelLayout"; });
-		std::string words(name);
-		std::ranges::replace(words, '_', ' ');
-		const AudioChannelLayout layout = ReadLayout(required != sRequiredLayouts.end() ? required->mLabels : words);
-		EXPECT_TRUE(std::ranges::equal(labels, layout)) << name;
+		table >> factory >> channels >> std::ws;
+		std::getline(table, labels);
+		const std::string name = "Create" + std::string(layout.mName);
+		EXPECT_TRUE(factory == name || factory == name + "ChannelLayout") << factory;
+		EXPECT_TRUE(std::ranges::equal(layout.mLabels, ReadLayout(labels))) << factory;
+		EXPECT_EQ(std::to_string(layout.mLabels.size()), channels) << factory;
+		// In the header they stand after the declaration or before it, where the factory's name does not list them.
+		std::string words = labels;
+		std::ranges::replace(words, ' ', '_');
+		const std::string declaration = "ZONMEDIATYPES_API AudioChannelLayout " + factory + "();";
+		const std::size_t place = header.find(declaration);
+		EXPECT_TRUE(factory == "Create_" + words + "_ChannelLayout"
+			|| header.substr(place, header.find('\n', place) - place).ends_with("///< " + labels)
+			|| header.find("/// " + labels + "\n" + declaration) != std::string::npos)
+			<< factory;
 	}
+	EXPECT_EQ(table.peek(), std::char_traits<char>::eof());
+}
+
+TEST(ChannelLayouts, AreMadeByTheirFactories)
+{
+	EXPECT_EQ(Create51ChannelLayout(), ReadLayout("L R C LFE Ls Rs"));
 	EXPECT_EQ(Create_L_R_C_LFE_ChannelLayout(), ReadLayout("L R C LFE"));
-	std::ostringstream header;
-	header << std::ifstream(ZON_TEST_DATA "/../../zonmediatypes/AudioChannelLayoutCatalogue.h").rdbuf();
-	for (const auto& [factory, create, labels] : sRequiredLayouts)
-	{
-		EXPECT_EQ(create(), ReadLayout(labels)) << factory;
-		// The declaration with the line before it, and its comment in one of them.
-		const std::size_t place = header.str().find("_API AudioChannelLayout " + factory + "();");
-		const std::size_t begin = header.str().rfind('\n', header.str().rfind('\n', place) - 1);
-		const std::string lines = header.str().substr(begin, header.str().find('\n', place) - begin);
-		EXPECT_TRUE(lines.ends_with("///< " + labels) || lines.starts_with("\n/// " + labels + "\n")) << lines;
-	}
+	EXPECT_EQ(Create_VST_7_1_Cine_Top_Center_Layout(), ReadLayout("L R C LFE Ls Rs Cs Ts"));
+	EXPECT_EQ(CreateSMPTEDigitalCinema4Channel(), ReadLayout("L R C * Cs * * * * * * * * * * *"));
 }
 
 TEST(ChannelLayouts, OfAnyCount)

@@ -7,7 +7,6 @@
 #include <gtest/gtest.h>
 
 #include <boost/lexical_cast.hpp>
-#include <cmath>
 #include <iomanip>
 #include <limits>
 #include <sstream>
@@ -144,19 +143,19 @@ TEST(PixelAspectRatioUtils, KeepThePictureWhenItIsDownsampled)
 		PointT<int> mFrom, mTo;
 		std::pair<unsigned, unsigned> mTerms;
 	} cases[] = {
-		{{1, 1}, {1920, 1080}, {960, 1080}, {2, 1}},                // half the width
-		{{768, 702}, {720, 576}, {360, 288}, {768, 702}},           // the same shape: as it was
-		{{6, 4}, {1920, 1080}, {1902, 1080}, {6, 4}},               // within 1 %
-		{{6, 4}, {1920, 1080}, {1900, 1080}, {144, 95}},            // beyond
-		{{6, 4}, {1920, 1080}, {1941, 1080}, {960, 647}},           // beyond, the other way
-		{{1, 1}, {1920, 1080}, {0, 1080}, {1, 1}},                  // a denominator of 0
-		{{3, 0}, {1920, 1080}, {960, 1080}, {1, 1}},                // another
-		{{1, 1}, {5, 0}, {5, 0}, {1, 1}},                           // no shapes to compare
-		{{0, 7}, {1920, 1080}, {960, 1080}, {0, 1}},                // nothing stays nothing
-		{{1, 1}, {-1920, 1080}, {960, 1080}, {0u - 2, 1}},          // modulo 2^32
-		{{1, 1}, {1920, 1080}, {-960, 1080}, {0u - 2, 1}},          // the sign goes to the numerator
-		{{1, 1}, {2'147'483'646, 1}, {1, 1}, {2'147'483'646, 1}},   // the largest term
-		{{1, 1}, {2'147'483'647, 1}, {1, 1}, {2'147'483'646, 1}},   // the nearest one that fits
+		{{1, 1}, {1920, 1080}, {960, 1080}, {2, 1}},   // half the width
+		// The same shape, and within 1 %: as it was; beyond it both ways
+		{{768, 702}, {720, 576}, {360, 288}, {768, 702}}, {{6, 4}, {1920, 1080}, {1902, 1080}, {6, 4}},
+		{{6, 4}, {1920, 1080}, {1900, 1080}, {144, 95}}, {{6, 4}, {1920, 1080}, {1941, 1080}, {960, 647}},
+		// A denominator of 0
+		{{1, 1}, {1920, 1080}, {0, 1080}, {1, 1}}, {{3, 0}, {1920, 1080}, {960, 1080}, {1, 1}},
+		{{1, 1}, {5, 0}, {5, 0}, {1, 1}},              // no shapes to compare
+		{{0, 7}, {1920, 1080}, {960, 1080}, {0, 1}},   // nothing stays nothing
+		// Modulo 2^32, and the sign goes to the numerator
+		{{1, 1}, {-1920, 1080}, {960, 1080}, {0u - 2, 1}}, {{1, 1}, {1920, 1080}, {-960, 1080}, {0u - 2, 1}},
+		// The largest term, and the nearest one that fits
+		{{1, 1}, {2'147'483'646, 1}, {1, 1}, {2'147'483'646, 1}},
+		{{1, 1}, {2'147'483'647, 1}, {1, 1}, {2'147'483'646, 1}},
 		{{4'000'000'007, 4'000'000'009}, {2, 1}, {1, 1}, {closest.numerator(), closest.denominator()}},   // too large
 		{{2, 1}, {kLeast, 1}, {1, kLeast}, {0u - 2'147'483'646, 1}},   // 2^31 x 2^31 x 2 wraps to -2^63
 	};

@@ -181,53 +181,43 @@ TEST(SelectNearestSourcePixelFormat, PrefersCheapThenShallowThenFirst)
 // A list is a vector, as hosts have it, or anything else that formats lie in.
 TEST(PixelFormatLists, MayBeKeptAnywhere)
 {
-	constexpr PixelFormat kNone{};
-	const PixelFormat vuyx = kPixelFormat_VUYX_4444_8u;
-	const PixelFormat array[] = {sUYVY, vuyx};
-	const PixelFormats vector(std::begin(array), std::end(array));
-	const std::span<const PixelFormat> span(array);
-	const auto quality = kRenderQuality_High;
-	const auto expect = [&](const auto& inList)
+	const PixelFormat array[] = {sUYVY, sVUYA};
+	const auto expectSelections = [&](const auto& inList)
 	{
-		EXPECT_EQ(SelectNearestSourcePixelFormat(inList, vuyx.mProperties, quality), vuyx);
-		EXPECT_EQ(SelectNearestPixelFormat(inList, sUYVY, array, quality, false), sUYVY);
-		EXPECT_EQ(SelectNearestPixelFormat(vector, sUYVY, inList, quality, false), sUYVY);
-		EXPECT_EQ(SelectNearestPixelFormat({vuyx}, sUYVY, inList, quality, false), vuyx);
-		EXPECT_EQ(SelectNearestPixelFormat(inList, sUYVY, {}, quality, false), vuyx);
+		EXPECT_EQ(SelectNearestSourcePixelFormat(inList, sVUYA.mProperties, kRenderQuality_Low), sVUYA);
+		EXPECT_EQ(SelectNearestPixelFormat(inList, sUYVY, array, kRenderQuality_Low, false), sUYVY);
+		EXPECT_EQ(SelectNearestPixelFormat({sVUYA}, sUYVY, inList, kRenderQuality_Low, false), sVUYA);
+		EXPECT_EQ(SelectNearestPixelFormat(inList, sUYVY, {}, kRenderQuality_Low, false), sVUYA);
 	};
-	expect(vector);
-	expect(array);
-	expect(std::to_array(array));
-	expect(span);
-	EXPECT_EQ(SelectNearestPixelFormat({sUYVY}, sUYVY, {sUYVY, vuyx}, quality, false), sUYVY);
-	EXPECT_EQ(SelectNearestPixelFormat({}, sUYVY, {}, quality, false), kNone);
-	EXPECT_EQ(SelectNearestSourcePixelFormat({sUYVY, vuyx}, vuyx.mProperties, quality), vuyx);
-	EXPECT_EQ(SelectNearestSourcePixelFormat({}, vuyx.mProperties, quality), kNone);
+	expectSelections(array);
+	expectSelections(std::to_array(array));
+	expectSelections(std::span<const PixelFormat>(array));
+	expectSelections(PixelFormats(std::begin(array), std::end(array)));
+	EXPECT_EQ(SelectNearestPixelFormat({sUYVY}, sUYVY, {sUYVY, sVUYA}, kRenderQuality_Low, false), sUYVY);
+	EXPECT_EQ(SelectNearestPixelFormat({}, sUYVY, {}, kRenderQuality_Low, false), kPixelFormat_Invalid);
+	EXPECT_EQ(SelectNearestSourcePixelFormat({sUYVY, sVUYA}, sVUYA.mProperties, kRenderQuality_Low), sVUYA);
+	EXPECT_EQ(SelectNearestSourcePixelFormat({}, sVUYA.mProperties, kRenderQuality_Low), kPixelFormat_Invalid);
 }
 
 // ---- Working formats -------------------------------------------------------------------------------------------------
 
 TEST(Select4444PixelFormat, GivesAWorkingFormat)
 {
+	const PixelFormat vuyx = kPixelFormat_VUYX_4444_8u, vuyx709 = kPixelFormat_VUYX_4444_8u_709;
+	const PixelFormat bgrx = kPixelFormat_BGRX_4444_8u, argb15 = kPixelFormat_ARGB_4444_15u;
+	const PixelFormat any = kPixelFormat_Any, invalid = kPixelFormat_Invalid;
 	const struct
 	{
 		PixelFormat mFormat, mLow, mHigh;
-	} cases[] = {
-		{kPixelFormat_YUYV_422_8u_709, kPixelFormat_VUYX_4444_8u_709, kPixelFormat_VUYX_4444_8u_709},
-		{kPixelFormat_PALDV25, kPixelFormat_VUYX_4444_8u, kPixelFormat_VUYX_4444_8u},
-		{kPixelFormat_V210_422_10u, kPixelFormat_VUYX_4444_8u, kPixelFormat_VUYX_4444_32f},
-		{kPixelFormat_UYVY_422_32f_709, kPixelFormat_VUYX_4444_8u_709, kPixelFormat_VUYX_4444_32f_709},
-		{With(sUYVY, &P::SetIsFloat, 1), kPixelFormat_VUYX_4444_8u, kPixelFormat_VUYX_4444_32f},
+	} cases[] = {{kPixelFormat_YUYV_422_8u_709, vuyx709, vuyx709}, {kPixelFormat_PALDV25, vuyx, vuyx},
+		{kPixelFormat_V210_422_10u, vuyx, kPixelFormat_VUYX_4444_32f},
+		{kPixelFormat_UYVY_422_32f_709, vuyx709, kPixelFormat_VUYX_4444_32f_709},
+		{With(sUYVY, &P::SetIsFloat, 1), vuyx, kPixelFormat_VUYX_4444_32f},
 		{With(sUYVY, &P::SetAlpha, 2), kPixelFormat_VUYP_4444_8u, kPixelFormat_VUYP_4444_8u},
-		{kPixelFormat_RGB_444_10u, kPixelFormat_BGRX_4444_8u, kPixelFormat_BGRX_4444_32f},
-		{kPixelFormat_YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_709_FullRange, kPixelFormat_BGRX_4444_8u,
-			kPixelFormat_BGRX_4444_8u},
-		{kPixelFormat_ARGB_4444_15u, kPixelFormat_ARGB_4444_15u, kPixelFormat_ARGB_4444_15u},
-		{kPixelFormat_Any, kPixelFormat_Any, kPixelFormat_Any},
-		{kPixelFormat_Invalid, kPixelFormat_Invalid, kPixelFormat_Invalid},
-		{{kPixelFormatFourCC_Invalid, sBGRA.mProperties}, kPixelFormat_Invalid, kPixelFormat_Invalid},
-		{{kPixelFormatFourCC_Invalid, sUYVY.mProperties}, kPixelFormat_VUYX_4444_8u, kPixelFormat_VUYX_4444_8u},
-	};
+		{kPixelFormat_RGB_444_10u, bgrx, kPixelFormat_BGRX_4444_32f},
+		{kPixelFormat_YUV_420_MPEG4_FIELD_PICTURE_PLANAR_8u_709_FullRange, bgrx, bgrx}, {argb15, argb15, argb15},
+		{any, any, any}, {invalid, invalid, invalid}, {{invalid.mName, sBGRA.mProperties}, invalid, invalid},
+		{{invalid.mName, sUYVY.mProperties}, vuyx, vuyx}};
 	for (const auto& [format, low, high] : cases)
 	{
 		EXPECT_EQ(Select4444PixelFormat(format, kRenderQuality_Low), low) << format;
@@ -235,8 +225,7 @@ TEST(Select4444PixelFormat, GivesAWorkingFormat)
 	}
 	for (const PixelFormat format : EveryPixelFormat())
 		EXPECT_EQ(
-			Select4444PixelFormat(format, kRenderQuality_Max).mProperties.Is4444(), format.mProperties.IsConcrete())
-			<< format;
+			Select4444PixelFormat(format, kRenderQuality_Max).mProperties.Is4444(), format.mProperties.IsConcrete());
 }
 
 TEST(SelectDVDecompressionFormat, GoesByTheCompressionAlone)
