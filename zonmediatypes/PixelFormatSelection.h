@@ -69,14 +69,15 @@ inline constexpr int kPixelConversionCost_Impossible = 10'000;
 ZONMEDIATYPES_API int PixelConversionCost(
 	const PixelFormatProperties& inFrom, const PixelFormatProperties& inTo, RenderQuality inQuality) noexcept;
 
-/// The format for frames between a producer of inSourceFormats and a consumer of inDestinationFormats: the request, when
-/// it is preferred and accepted; else a format that both know; else the cheapest conversion, of several the one nearest
-/// to the request; else a format that can be worked in. kPixelFormat_Invalid when there is none.
+/// The format for frames between a producer of inSourceFormats and a consumer of inDestinationFormats; the first of:
+///  1. the request, when it is preferred and accepted, if only by kPixelFormat_Any;
+///  2. a format that both know, in the consumer's order;
+///  3. what the cheapest conversion leads to, of several the one nearest to the request; where kPixelFormat_Any is accepted,
+///     what the first cheapest one starts from (but what an equally cheap one nearer to the request leads to: deliberate);
+///  4. a format that can be worked in, with a fourth component before others;
+///  5. kPixelFormat_Invalid.
 ///
-/// The result can be a format that the producer does not make, or the request although neither list names it: ask for the
-/// cost of getting there. The cheapest conversion gives the format that it leads to. Where kPixelFormat_Any is accepted
-/// beside other formats, the first cheapest one gives the format that it starts from instead; an equally cheap one after it
-/// that is nearer to the request still gives the one that it leads to (deliberate).
+/// It can be a format that the producer does not make, or a request that neither list names: ask for the cost of getting there.
 ZONMEDIATYPES_API PixelFormat SelectNearestPixelFormat(const PixelFormats& inSourceFormats,
 	PixelFormat inRequestedFormat, const PixelFormats& inDestinationFormats, RenderQuality inQuality,
 	bool inPreferRequested) noexcept;
