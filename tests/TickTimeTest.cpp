@@ -14,10 +14,8 @@
 #include <iomanip>
 #include <limits>
 #include <locale>
-#include <optional>
 #include <sstream>
 #include <string>
-#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -69,26 +67,15 @@ TEST(TickTimeFrames, MovesByFrames)
 
 TEST(TickTimeFrames, BeginExactlyOrNowhere)
 {
-	const std::tuple<std::int64_t, FrameRate, std::optional<std::int64_t>> cases[] = {
-		{-90, kFrameRate_VideoPAL, -914'457'600'000},
-		{0, kTen, 0},
-		{kMost / 10, kTen, kMost - 7},
-		{kMost / 10 + 1, kTen, std::nullopt},
-		{kLeast / 10, kTen, kLeast + 8},
-		{kLeast / 10 - 1, kTen, std::nullopt},
-		{2, FrameRate(kLeast / 2), kLeast},
-		{-2, FrameRate(kLeast / 2), std::nullopt},
-		{kLeast, FrameRate(-1), std::nullopt},
-		{kLeast, FrameRate(1), kLeast},
-		{0, kFrameRate_Zero, std::nullopt},
-		{1, FrameRate(0), std::nullopt},
-	};
-	for (const auto& [frames, rate, ticks] : cases)
-	{
-		const std::optional<TickTime> time = TickTime::FromFrames(frames, rate);
-		EXPECT_EQ(time.has_value(), ticks.has_value()) << frames;
-		EXPECT_EQ(time.value_or(kTime_Zero).GetTicks(), ticks.value_or(0)) << frames;
-	}
+	constexpr FrameRate kLong(kLeast / 2), kBack(-1);
+	static_assert(TickTime::FromFrames(-90, kFrameRate_VideoPAL) == TickTime(-914'457'600'000));
+	static_assert(TickTime::FromFrames(0, kTen) == kTime_Zero && TickTime::FromFrames(kLeast, FrameRate(1)));
+	static_assert(TickTime::FromFrames(kMost / 10, kTen) == TickTime(kMost - 7));
+	static_assert(TickTime::FromFrames(kLeast / 10, kTen) == TickTime(kLeast + 8));
+	static_assert(!TickTime::FromFrames(kMost / 10 + 1, kTen) && !TickTime::FromFrames(kLeast / 10 - 1, kTen));
+	static_assert(TickTime::FromFrames(2, kLong) == TickTime(kLeast) && !TickTime::FromFrames(-2, kLong));
+	static_assert(TickTime::FromFrames(kMost, kBack) == TickTime(-kMost) && !TickTime::FromFrames(kLeast, kBack));
+	static_assert(!TickTime::FromFrames(0, kFrameRate_Zero) && !TickTime::FromFrames(1, FrameRate(0)));
 }
 
 TEST(TickTimeFrames, Aligns)
