@@ -7,10 +7,8 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
-#include <optional>
 #include <span>
 #include <string_view>
-#include <utility>
 
 // ---- The fixed layouts -----------------------------------------------------------------------------------------------
 
@@ -206,25 +204,26 @@ namespace
 struct DefaultLayout
 {
 	std::span<const AudioChannelLabel> mLabels;
-	bool mIsForAll;   // for maps and formats, too
+	bool mIsForAll = true;   // for maps and formats, too
 };
 
-constexpr auto sDefaultLayouts = std::to_array<DefaultLayout>({
-	{LabelsOf("Mono"), true},
-	{LabelsOf("Stereo"), true},
-	{LabelsOf("Quadraphonic"), false},
-	{LabelsOf("Broadcast51"), true},
-	{LabelsOf("7_1Itu"), false},
-});
+// By the number of channels; a layout without labels where the number stands for none.
+constexpr auto sDefaultsByCount = []
+{
+	std::array<DefaultLayout, 9> layouts{};
+	for (const DefaultLayout layout : {DefaultLayout{LabelsOf("Mono")}, {LabelsOf("Stereo")},
+			 {LabelsOf("Quadraphonic"), false}, {LabelsOf("Broadcast51")}, {LabelsOf("7_1Itu"), false}})
+		layouts.at(layout.mLabels.size()) = layout;
+	return layouts;
+}();
 
 }   // namespace
 
-std::optional<AudioChannelLayout> DefaultLayoutOf(std::size_t inChannelCount, DefaultFor inWhat)
+std::span<const AudioChannelLabel> DefaultLabels(std::size_t inChannelCount, DefaultFor inWhat) noexcept
 {
-	for (const auto& [labels, isForAll] : sDefaultLayouts)
-		if (labels.size() == inChannelCount && (isForAll || inWhat == DefaultFor::Layouts))
-			return MakeLayout(labels);
-	return std::nullopt;
+	const DefaultLayout layout
+		= inChannelCount < sDefaultsByCount.size() ? sDefaultsByCount[inChannelCount] : DefaultLayout();
+	return layout.mIsForAll || inWhat == DefaultFor::Layouts ? layout.mLabels : std::span<const AudioChannelLabel>();
 }
 
 AudioChannelLayout CreateMultichannelLayout(int inCount)
@@ -234,9 +233,8 @@ AudioChannelLayout CreateMultichannelLayout(int inCount)
 
 AudioChannelLayout CreateMultichannelLayoutWithDefaultLabels(std::size_t inCount)
 {
-	auto layout = DefaultLayoutOf(inCount, DefaultFor::Layouts);
-	return layout ? *std::move(layout)
-				  : CreateMultichannelLayout(static_cast<std::int32_t>(inCount));   // its low 32 bits
+	const auto labels = DefaultLabels(inCount, DefaultFor::Layouts);
+	return labels.empty() ? CreateMultichannelLayout(static_cast<std::int32_t>(inCount)) : MakeLayout(labels);
 }
 
 }   // namespace zonmediatypes

@@ -4,6 +4,8 @@
 #include "zonmediatypes/src/audio/OrderedChannelLabels.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <numeric>
 #include <utility>
 
 namespace zonmediatypes
@@ -45,10 +47,13 @@ ChannelMap::~ChannelMap() = default;
 
 ChannelMap ChannelMap::CreateDefaultChannelMap(std::int32_t inChannelCount)
 {
-	const auto layout = DefaultLayoutOf(static_cast<std::size_t>(inChannelCount), DefaultFor::MapsAndFormats);
-	ChannelMap map = layout ? ChannelMap(*layout) : ChannelMap(inChannelCount);
-	std::int32_t channel = 0;
-	std::ranges::generate(map.mAssignments, [&] { return channel++; });
+	const auto labels = DefaultLabels(static_cast<std::size_t>(inChannelCount), DefaultFor::MapsAndFormats);
+	ChannelMap map = labels.empty() ? ChannelMap(inChannelCount) : ChannelMap();
+	map.mLayouts.reserve(labels.size());
+	for (const AudioChannelLabel label : labels)
+		map.mLayouts.emplace_back(1, label);
+	map.mAssignments.resize(map.mLayouts.size());
+	std::iota(map.mAssignments.begin(), map.mAssignments.end(), 0);
 	return map;
 }
 

@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <tuple>
-#include <utility>
 
 namespace zonmediatypes
 {
@@ -40,8 +39,10 @@ AudioFormat::~AudioFormat() = default;
 
 AudioFormat AudioFormat::CreateDefaultAudioFormat(std::uint32_t inChannelCount, std::uint32_t inSampleRate)
 {
-	auto layout = DefaultLayoutOf(inChannelCount, DefaultFor::MapsAndFormats);
-	return CreateAudioFormat(layout ? *std::move(layout) : AudioChannelLayout(inChannelCount), inSampleRate);
+	const auto labels = DefaultLabels(inChannelCount, DefaultFor::MapsAndFormats);
+	return CreateAudioFormat(
+		labels.empty() ? AudioChannelLayout(inChannelCount) : AudioChannelLayout(labels.begin(), labels.end()),
+		inSampleRate);
 }
 
 AudioFormat AudioFormat::CreateAudioFormat(const AudioChannelLayout& inLayout, std::uint32_t inSampleRate)

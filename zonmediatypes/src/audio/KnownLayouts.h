@@ -3,7 +3,6 @@
 #include "zonmediatypes/AudioChannelLabel.h"
 
 #include <cstddef>
-#include <optional>
 #include <span>
 
 namespace zonmediatypes
@@ -21,7 +20,7 @@ enum class DefaultFor
 	MapsAndFormats
 };
 
-/// The layout of the catalogue that a number of channels stands for; empty where it stands for none.
-std::optional<AudioChannelLayout> DefaultLayoutOf(std::size_t inChannelCount, DefaultFor inWhat);
+/// The labels that a number of channels stands for, of a layout of the catalogue; empty where it stands for none.
+std::span<const AudioChannelLabel> DefaultLabels(std::size_t inChannelCount, DefaultFor inWhat) noexcept;
 
 }   // namespace zonmediatypes
