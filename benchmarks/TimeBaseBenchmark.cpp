@@ -2,8 +2,8 @@
 
 #include "Comparison.h"
 
+#include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/TimeUtils.h"
-#include "zonmediatypes/interop/TimeBase.h"
 
 #include <array>
 #include <cstdint>

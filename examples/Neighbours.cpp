@@ -1,10 +1,10 @@
 // Times from and to std::chrono and an MPEG clock, layouts as keys, and values in a log.
 
+#include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/interop/Chrono.h"
 #include "zonmediatypes/interop/Hash.h"
 #include "zonmediatypes/interop/Streams.h"
 #include "zonmediatypes/interop/Strings.h"
-#include "zonmediatypes/interop/TimeBase.h"
 
 #include "zonmediatypes/Timecode.h"
 

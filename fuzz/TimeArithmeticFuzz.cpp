@@ -6,9 +6,9 @@
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
 #include "zonmediatypes/TickTime.h"
+#include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 #include "zonmediatypes/TimeUtils.h"
-#include "zonmediatypes/interop/TimeBase.h"
 
 #include <boost/multiprecision/cpp_int.hpp>
 

@@ -6,7 +6,6 @@
 #include "zoncore/MessageCatalogue.h"
 #include "zoncore/RecursiveMutex.h"
 #include "zonmediatypes/ZONMediaTypes.h"
-#include "zonmediatypes/interop/TimeBase.h"
 
 #include <cstddef>
 #include <cstdint>

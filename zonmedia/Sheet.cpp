@@ -4,7 +4,7 @@
 #include "zonmedia/TimeNames.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelFormatUtils.h"
-#include "zonmediatypes/interop/TimeBase.h"
+#include "zonmediatypes/TimeBase.h"
 
 #include <array>
 #include <charconv>

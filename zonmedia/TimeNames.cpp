@@ -3,7 +3,7 @@
 #include "zoncore/StringUtils.h"
 #include "zonmedia/Input.h"
 #include "zonmediatypes/Descriptions.h"
-#include "zonmediatypes/interop/TimeBase.h"
+#include "zonmediatypes/TimeBase.h"
 
 #include <array>
 #include <charconv>

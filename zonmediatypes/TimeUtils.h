@@ -33,7 +33,7 @@ ZONMEDIATYPES_API RatioTime TimeToRatioTime(TickTime inTime);
 
 /// The nearest tick, exact halves rounded up (2.5 ticks give 3, -2.5 give -2). The conversion goes through double: it is
 /// exact for frames and samples of the named rates up to kTime_Max, but at 192 kHz for 78 hours only. Other fractions can
-/// miss the nearest tick, by one from the first minutes on, by a dozen at 100 hours; interop/TimeBase.h does not. What no
+/// miss the nearest tick, by one from the first minutes on, by a dozen at 100 hours; TimeBase.h does not. What no
 /// tick count holds gives the most negative one.
 ZONMEDIATYPES_API TickTime RatioTimeToTime(RatioTime inTime) noexcept;
 

@@ -22,6 +22,7 @@
 #include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
 #include "zonmediatypes/TickTime.h"
+#include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
 #include "zonmediatypes/TimeUtils.h"

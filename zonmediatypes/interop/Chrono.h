@@ -11,7 +11,7 @@
 /// conversion away from ticks, name their rounding. Results are optional: one that does not fit is empty. kTime_Invalid is
 /// a time like any other, 400,000 s before zero: compare with it first.
 
-#include "zonmediatypes/interop/TimeBase.h"
+#include "zonmediatypes/TimeBase.h"
 
 #include <chrono>
 #include <cmath>

@@ -23,7 +23,7 @@
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/TickTime.h"
-#include "zonmediatypes/interop/TimeBase.h"
+#include "zonmediatypes/TimeBase.h"
 
 #include <algorithm>
 #include <array>

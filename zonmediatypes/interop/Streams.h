@@ -21,8 +21,8 @@
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelFormat.h"
 #include "zonmediatypes/PixelFormatProperties.h"
+#include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/TimeConversionUtils.h"
-#include "zonmediatypes/interop/TimeBase.h"
 
 #include <algorithm>
 #include <array>
