@@ -10,8 +10,7 @@
 ///     cut.AddFrames(90, kFrameRate_VideoPAL);    // 914,457,600,000 ticks
 ///     cut.ToFrame64(kFrameRate_VideoPAL);        // 90
 ///
-/// Arithmetic wraps on overflow and reports nothing; only division by zero is reported. No operation but that report and
-/// the stream operators allocates memory, and each is a few instructions.
+/// Arithmetic wraps on overflow and reports nothing; only division by zero is reported.
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/SourcePlace.h"

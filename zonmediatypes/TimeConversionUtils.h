@@ -15,10 +15,8 @@
 ///     ConvertTimecodeToSamples(samples, text, kTimecodeFormat_TimecodeDropFrame, 48'000, 30, nullptr, false);
 ///                                                                       // 2,882,880
 ///
-/// All functions are pure, take any argument without undefined behaviour (integers wrap, a floating-point value that
-/// does not fit its integer becomes the most negative one) and allocate nothing but the text that they return. They
-/// depend on no locale and may be called from any thread. Reading text costs time linear in its length and copies none
-/// of it.
+/// Integers wrap, and a floating-point value that does not fit its integer becomes the most negative one. Reading text
+/// costs time linear in its length and copies none of it.
 ///
 /// Misuse (no BeatInfo for a musical format, no beats per bar, drop-frame together with NTSC) is reported to the assert
 /// dialog of zoncore/Debug.h; the result is then false, of the forms for buffers 0, and the output is as before the call.
@@ -69,15 +67,23 @@ struct BeatInfo
 // reads back as a positive position. A field above 2,147,483,647 counts as 0. Only sample counts and the numbers of
 // bars-and-beats text are read with a sign, as zoncore::utility::StringToNumber reads them.
 
-/// Timecode text as a position, rounded up to the next sample. Fields are right-aligned into hours, minutes, seconds
-/// and frames, so that "3:04" is 3 s 4 frames and "10" is 10 frames; of five fields the first one is dropped. A field
-/// behind a "." is a fraction of a frame: "10.5" is ten frames and a half. Its divisor deliberately counts every
-/// character up to the end of the text: "10.5 " with a blank behind it is 10.05 frames, "12." is 0.012 frames, and ten
-/// or more such characters turn the value around.
+/// Timecode text as a position, rounded up to the next sample; always true.
 ///
-/// inNTSC scales the rate by 1000/1001. inDropFrame reads drop-frame labels, where the dropped labels at the start of a
-/// minute stand for the first one that exists; it does not itself imply inNTSC. Empty text is -1, text without digits
-/// and a frame rate of 0 give 0. Always true.
+/// Fields are hours, minutes, seconds and frames from the right; of five the first is dropped, and no sixth is read. A field
+/// after a "." is a fraction of a frame, whose digits deliberately are all characters up to the end of the text; ten or more
+/// turn the value around. inNTSC scales the rate by 1000/1001; inDropFrame reads drop-frame labels, of which one that is
+/// skipped stands for the first of its minute, and does not itself imply inNTSC. At 48 kHz and 30 frames per second:
+///
+/// | text                           | samples                                                  |
+/// |--------------------------------|----------------------------------------------------------|
+/// | "00:00:01:00"                  | 48,000, with inNTSC 48,048                               |
+/// | "3:04", "-3:04"                | 150,400: 3 s 4 frames                                    |
+/// | "10"                           | 16,000: 10 frames                                        |
+/// | "10.50", "10.5 "               | 16,800: 10.5 frames, 16,080: 10.05 frames                |
+/// | "12.", ".5"                    | 20: 0.012 frames, 800: half a frame                      |
+/// | "1:2:3:4:5:6"                  | 354,440,000: 2 h 3 min 4 s 5 frames                      |
+/// | "00:01:00;00", "00:01:00;02"   | with inDropFrame 2,880,000, with both flags 2,882,880    |
+/// | "", "abc"                      | -1: no value, 0; at a frame rate of 0 all text is 0      |
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inTimecode,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inNTSC, bool inDropFrame) noexcept;
 
@@ -88,11 +94,23 @@ inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UT
 		outSamples, zoncore::UTF16StringView(inTimecode), inSampleRate, inFrameRate, inNTSC, inDropFrame);
 }
 
-/// Text of any format as a position. Empty text is -1, meaning no value; None and unknown formats are 0. Text in
-/// Decimal, Beats and Milliseconds is read as timecode one place to the left, so that "1:30" is 90 s (or beats, or
-/// milliseconds), "1:00:00" is an hour and "1:00:00:00" deliberately loses its hours; the result is rounded to the
-/// nearest sample. inBeatInfo is needed for Beats and BarsAndBeats only, inIsDuration matters for BarsAndBeats only.
+/// Text of any format as a position. inBeatInfo matters for Beats and BarsAndBeats, inIsDuration for BarsAndBeats only.
 /// False, and outSamples untouched, when a BeatInfo is needed and missing.
+///
+/// Decimal, Beats and Milliseconds are fields as in timecode, of which the last is in units of the format and may have a
+/// fraction; the one before counts 60 of them, the next 3,600. Positions are rounded to the nearest sample. At 48 kHz and 120
+/// quarter notes a minute:
+///
+/// | format                  | text            | samples                                                  |
+/// |-------------------------|-----------------|----------------------------------------------------------|
+/// | Decimal                 | "1:30"          | 4,320,000: 90 s                                          |
+/// |                         | "1:2:03.25"     | 178,716,000: 1 h 2 min 3.25 s                            |
+/// |                         | "1:00:00:00"    | 0: four fields lose the first one; deliberate            |
+/// | Milliseconds            | "1000.5"        | 48,024                                                   |
+/// | Beats                   | "4.25"          | 102,000                                                  |
+/// | Samples                 | " -12 frames"   | -12                                                      |
+/// | any                     | ""              | -1: no value                                             |
+/// | None, and unknown ones  | "1:00"          | 0                                                        |
 ZONMEDIATYPES_API bool ConvertTimecodeToSamples(std::int64_t& outSamples, zoncore::UTF16StringView inText,
 	TimecodeFormat inFormat, std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo,
 	bool inIsDuration);
@@ -105,15 +123,20 @@ inline bool ConvertTimecodeToSamples(std::int64_t& outSamples, const zoncore::UT
 		outSamples, zoncore::UTF16StringView(inText), inFormat, inSampleRate, inFrameRate, inBeatInfo, inIsDuration);
 }
 
-/// Bars-and-beats text as a position: bar, ":", beat, and optionally "." and ticks, as
-/// in "5:3.120"; text without ":" is a bar alone. With iTicksPerBeat -1 what follows "." is a decimal fraction of a
-/// beat. The first ":" and the first "." count, wherever they stand: in "2:2.5" the 5 is five ticks.
+/// Bars-and-beats text as a position: bar, ":", beat, "." and ticks, of which all but the bar may be missing. The first ":"
+/// and the first "." count, wherever they stand. A position counts bars and beats from 1, and the first bar begins at
+/// dOffsetMilliseconds; a duration counts from 0. With iTicksPerBeat -1 what follows "." is a decimal fraction of a beat.
+/// A half is added to the samples and the sum truncated: to the nearest sample after the first bar, before it deliberately
+/// one later. A tempo, beat value or tick count of 0 has no meaningful result. At 48 kHz, 120 quarter notes a minute, 4/4
+/// and 960 ticks a beat:
 ///
-/// As a position bars and beats count from 1 and the first bar begins at dOffsetMilliseconds; as a duration they count
-/// from 0. A tempo, beat value or tick count of 0 has no meaningful result.
-///
-/// Samples are rounded by adding a half and truncating toward zero: to the nearest behind the first bar, and in front of
-/// it deliberately one later, whole samples too. "0:4" at 120 in 4/4 and 48 kHz is -23,999. A negative offset likewise.
+/// | text       | as         | samples                                               |
+/// |------------|------------|-------------------------------------------------------|
+/// | "2:2.480"  | a position | 132,000: 1 bar, 1 beat and a half                     |
+/// | "1:1.480"  | a duration | 132,000                                               |
+/// | "3"        | a position | 192,000: a bar alone                                  |
+/// | "2:2.5"    | a duration | 240,125: five ticks; with iTicksPerBeat -1 252,000    |
+/// | "0:4"      | a position | -23,999: one later than a beat before the first bar   |
 ZONMEDIATYPES_API std::int64_t ConvertBarsAndBeatsToSamples(
 	zoncore::UTF16StringView inText, double inSampleRate, const BeatInfo& inBeatInfo, bool inIsDuration) noexcept;
 
@@ -150,21 +173,23 @@ ZONMEDIATYPES_API std::size_t ConvertSamplesToTimecode(std::span<char> outText, 
 	std::int32_t inSampleRate, TimecodeFormat inFormat, std::int32_t inFrameRate, const BeatInfo* inBeatInfo,
 	bool inIsDuration);
 
-/// A position as timecode; frames are truncated, negative positions have "-" in front, hours do not wrap at 24.
+/// A position as timecode; frames are truncated, negative positions have "-" before them, hours do not wrap at 24. Frames
+/// have as many digits as the largest frame number of the rate, up to four, and two in drop-frame text. The text is "0" for a
+/// sample rate of 0 or below, and for a frame rate below 1 (drop-frame: below 30) or whose frames per minute or hour are 0
+/// in 32 bits. At 48 kHz and 30 frames per second:
 ///
-/// - inDropFrame: drop-frame labels, "00;01;00;02", at 1000/1001 of the nominal rate; the flags behind inFrameCountOnly
-///   have no effect.
-/// - inNTSC: non-drop labels at 1000/1001 of the nominal rate. Together with inDropFrame it is misuse: false.
-/// - inFrameCountOnly: the frame count as a 32-bit number, without sign. Drop-frame counts come from a floating-point
-///   formula and are one short on about every twentieth frame.
-/// - inOmitFrames: ends behind the seconds. Their leading zeros are then never suppressed.
-/// - inSuppressLeadingZeros: leaves out zero fields in front, "5:00"; frames are always written.
-/// - inShowSubframes: "." and hundredths of a frame behind the frames.
-/// - inTotalMinutes: no hours; minutes count on, "62:05:00".
-///
-/// Frames have as many digits as the largest frame number of the rate, up to four, and two in drop-frame text. The text
-/// is "0" for a sample rate of 0 or below, and for a frame rate below 1 (drop-frame: below 30) or whose frames per
-/// minute or hour are 0 in 32 bits.
+/// | flag                  | text                          | meaning                                                     |
+/// |-----------------------|-------------------------------|-------------------------------------------------------------|
+/// | none                  | "01:02:05:00"                 | non-drop labels at the nominal rate                         |
+/// | inDropFrame           | "00;01;00;02"                 | labels at 1000/1001 of it; the flags from inOmitFrames on   |
+/// |                       |                               | have no effect                                              |
+/// | inNTSC                | "00:00:01:00"                 | non-drop labels at 1000/1001; with inDropFrame misuse       |
+/// | inFrameCountOnly      | "1800"                        | 32-bit, without sign; drop-frame counts are formed through  |
+/// |                       |                               | double and one short on about every twentieth frame         |
+/// | inOmitFrames          | "01:02:05"                    | no leading zeros of the seconds are left out then           |
+/// | inSuppressLeadingZeros| "59:03", "1:00:00", "0"       | no leading fields of 0; frames are always written           |
+/// | inShowSubframes       | "00:00:05:00.50"              | hundredths of a frame                                       |
+/// | inTotalMinutes        | "62:05:00"                    | no hours: minutes count on                                  |
 ZONMEDIATYPES_API bool ConvertSamplesToTimecode(zoncore::UTF16String& outText, std::int64_t inSamples,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, bool inDropFrame, bool inNTSC, bool inFrameCountOnly,
 	bool inOmitFrames, bool inSuppressLeadingZeros, bool inShowSubframes, bool inTotalMinutes);
@@ -177,11 +202,11 @@ ZONMEDIATYPES_API void ConvertSamplesToDecimalTimecode(
 	zoncore::UTF16String& outText, std::int64_t inSamples, std::int32_t inSampleRate, bool inOmitFraction);
 
 /// A position as bars and beats. inStyle 0 is the bar alone, 1 "bar:beat", 2 "bar:beat.ticks", 3 and above have
-/// thousandths of a tick behind another "."; negative styles give an empty text. Ticks have as many digits as the
+/// thousandths of a tick after another "."; negative styles give an empty text. Ticks have as many digits as the
 /// largest one. Positions count from "1:1.000" at dOffsetMilliseconds, durations from "0:0.000"; before the first bar
 /// bars count down through 0 while beats stay 1 to iBeatsPerBar.
 ///
-/// With iTicksPerBeat -1 the text is, for every style, the bar and right behind it the beat with decimals whose digits
+/// With iTicksPerBeat -1 the text is, for every style, the bar and right after it the beat with decimals whose digits
 /// are all "0" (from style 3 on ".000" follows): deliberate, and no reader takes it. At a sample rate, tempo, beat value
 /// or iTicksPerBeat of 0 the text means nothing. False, and outText untouched, when iBeatsPerBar is 0.
 ZONMEDIATYPES_API bool ConvertSamplesToBarsAndBeats(zoncore::UTF16String& outText, double inSamples,

@@ -3,8 +3,8 @@
 /// \file
 /// The ways in which a time is shown: timecode at a fixed rate, counts of frames, film feet, samples or milliseconds.
 ///
-/// All functions are pure and take a few instructions. Any 32-bit number may be passed as a display; one that is no
-/// enumerator gives the neutral result that each function states.
+/// Any 32-bit number may be passed as a display; one that is no enumerator gives the neutral result that each function
+/// states.
 
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"

@@ -9,9 +9,6 @@
 ///
 /// Compare a boost::rational with a boost::rational only, never with a bare integer: with C++20, g++ 12 and Boost 1.74
 /// that comparison never returns.
-///
-/// All functions are pure, allocate nothing and cost at most a greatest common divisor; the exceptions that some throw are
-/// those of Boost.Rational.
 
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"

@@ -9,11 +9,7 @@
 /// Every function takes a display and the caller's rate, that of the media. The display's own rate counts where it has
 /// one; the caller's rate counts for frames, feet and samples, decides when frames carry into seconds and how a run of
 /// digits is read, and is the rate of the frame that kTimecodeFlag_LastFrame moves by. Pass the rate that belongs to the
-/// display, or the media's at the displays without one: the run "500" at 25 fps timecode is 5 s with a 25 fps rate and
-/// 20 s with a 48 kHz rate.
-///
-/// Any argument is accepted. All functions are pure and may be called from any thread; none allocates anything but the
-/// string that it returns, and those that write into a caller's buffer or fill a column allocate nothing.
+/// display, or the media's at the displays without one.
 
 #include "zoncore/Flags.h"
 #include "zoncore/UTF16String.h"
@@ -33,11 +29,12 @@ namespace zonmediatypes
 
 enum TimecodeFlag : unsigned int
 {
-	kTimecodeFlag_OmitHours
-	= 1,   ///< writes no hours, also where they are not 0 or carry what tells a negative time apart
-	kTimecodeFlag_TrimLeadingZeros
-	= 2,                          ///< leaves out leading fields that are zero, and the first field's leading zero
-	kTimecodeFlag_ShowSign = 4,   ///< writes "+" or "-" before a time that is not zero
+	/// Writes no hours, also where they are not 0 or carry what tells a negative time apart.
+	kTimecodeFlag_OmitHours = 1,
+	/// Leaves out leading fields that are zero, and the first field's leading zero.
+	kTimecodeFlag_TrimLeadingZeros = 2,
+	/// Writes "+" or "-" before a time that is not zero.
+	kTimecodeFlag_ShowSign = 4,
 	/// Shows the last frame of a range whose end is the time, and reads it as the end. The end of an empty range at zero
 	/// shows as the frame before zero, "-00:00:00:01" with a sign.
 	kTimecodeFlag_LastFrame = 8
@@ -105,28 +102,46 @@ ZONMEDIATYPES_API std::size_t TimeToTimecode(std::span<zoncore::UTF16Char> outTe
 ZONMEDIATYPES_API std::size_t TimeToTimecode(std::span<char> outText, TickTime inTime, FrameRate inRate,
 	TimeDisplay inDisplay, TimecodeFlags inFlags = {}) noexcept;
 
-/// The time of a text; kTime_Invalid for text that is rejected, kTime_Zero for an empty one. Only
-/// kTimecodeFlag_LastFrame has an effect: the time is one frame at inRate further from zero, on the side of the text's sign
-/// ("0" is frame 1, "-0" frame -1, feet of 0 are frame -1), for an empty text not. It does not undo the flag of
-/// TimeToTimecode for negative times.
+/// The time of a text: kTime_Zero for an empty one, kTime_Invalid for one that is rejected.
 ///
-/// Timecode, samples and milliseconds are a sign, which may be missing, and up to four groups of digits with ".", ":" or
-/// ";" between them, read from the right as frames, seconds, minutes and hours; after a last separator the group is 0.
-/// Nothing is range-checked: 99 minutes are 1 h 39 min. Digits are "0" to "9". Any other character is rejected, blanks
-/// around the text included, and so is an empty group between separators.
+/// Text is a sign, which may be missing, and one to four groups of the digits "0" to "9" with ".", ":" or ";" between them:
+/// frames, seconds, minutes and hours from the right, which HMSFToTime turns into a time. No number is out of range; one
+/// above 4,294,967,295 counts as that. One group alone is a run "HHMMSSFF"; at kTimeDisplay_Frames, and after a separator
+/// at any display, a count of frames at inRate. Any other character is rejected. Film text is a sign and two numbers with a
+/// separator or "+" between them; blanks before a number and other text after it are skipped, and what is none is 0.
 ///
-/// One group alone is a run "HHMMSSFF" read from the right, with 2 digits for the frames of rates up to 100 fps, 3 up to
-/// 1,000, 4 up to 10,000 and 5 above. After a leading separator it is a count of frames at inRate, as it is at
-/// kTimeDisplay_Frames. Groups above 4,294,967,295 count as that number; the time of so many frames may wrap.
+/// | display, rate        | text                               | time                                                  |
+/// |----------------------|------------------------------------|-------------------------------------------------------|
+/// | timecode, 25 fps     | "00:00:03:15", "+3:15", "3.15"     | frame 90                                              |
+/// |                      | "-3:15"                            | frame -90                                             |
+/// |                      | "3:"                               | 3 s: after a last separator the group is 0            |
+/// |                      | "1:0:0:0", "25:0:0:0"              | 1 h: hours wrap at 24                                 |
+/// |                      | "0:26", "99:00:00"                 | 1 s 1 frame, 1 h 39 min: what is too large carries    |
+/// |                      | "500", "1020304"                   | 5 s, 1 h 2 min 3 s 4 frames                           |
+/// |                      | ".1000", "-:1000"                  | frame 1,000, frame -1,000                             |
+/// |                      | "-", "1::2", "1:2:3:4:5", " 1"     | rejected                                              |
+/// | 29.97 fps drop-frame | "00:01:00;02", "00:01:00;00"       | frame 1,800: the minute's first                       |
+/// |                      | "00:01:00;01"                      | frame 1,799: the one before; see HMSFToTime           |
+/// | milliseconds         | "1.5", "1.500"                     | 1 s 5 ms, 1 s 500 ms: the last group is a count       |
+/// |                      | "1500"                             | 1 s 500 ms                                            |
+/// |                      | ".500" with a rate of 48 kHz       | 500 samples: a count                                  |
+/// | samples, 48 kHz      | "1:2:3:5", "204000"                | 1 h 2 min 3 s and 5 samples, 2 s and 4,000 samples    |
+/// | 25 fps, rate 48 kHz  | "500"                              | 20 s: a run has 5 digits for frames of that rate      |
+/// | frames, 25 fps       | "-1000"                            | frame -1,000                                          |
+/// |                      | "1:2"                              | rejected                                              |
+/// | 35 mm, 25 fps        | "12+08", "12:8", "1208"            | frame 200: without a separator two digits are frames  |
+/// |                      | "8"                                | frame 8                                               |
+/// |                      | "-12+08"                           | frame -200                                            |
+/// |                      | "+-1208"                           | frame -184: a second sign is the number's own         |
+/// |                      | " 12; 08x", "x+y"                  | frame 200, frame 0                                    |
+/// |                      | "1+2+3"                            | rejected                                              |
 ///
-/// At kTimeDisplay_Milliseconds the last group is a count of milliseconds, not a decimal fraction: "1.5" is 1 s 5 ms. A run
-/// of digits has 3 for them; but ".500" is 500 frames of inRate.
+/// A run has 2 digits for the frames of rates up to 100 fps, 3 up to 1,000, 4 up to 10,000 and 5 above: of inRate, at
+/// kTimeDisplay_Milliseconds of its own. Feet wrap at 32 bits, and the time of more frames than ticks can count wraps.
 ///
-/// Feet and frames are a sign and two numbers with ";", ":", "." or "+" between them. Without a separator the last two
-/// characters are the frames ("1208" is 12 feet 8 frames), two characters or less are frames only. A second sign belongs to
-/// its number ("+-1208" is -12 feet and 8 frames). What is no number counts as 0; the frames wrap at 32 bits.
-///
-/// A number that is no display is read as timecode and gives meaningless times.
+/// Only kTimecodeFlag_LastFrame has an effect: the time is one frame at inRate further from zero, on the side of the text's
+/// sign ("0" is frame 1, "-0" frame -1, film "0+00" frame -1), but that of an empty text. It does not undo the flag of
+/// TimeToTimecode for negative times. A number that is no display is read as timecode and gives meaningless times.
 ZONMEDIATYPES_API TickTime TimecodeToTime(
 	zoncore::UTF16StringView inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags = {}) noexcept;
 
@@ -155,7 +170,6 @@ ZONMEDIATYPES_API zoncore::UTF16String RatioTimeToTimecode(
 // A list of times that share rate, display and flags: the rows of an edit list, the labels of a ruler. Each row is what the
 // function for one time gives. The shorter span counts; the number of rows that were filled is returned. Where times become
 // fields or text, what depends on rate and display is done once and divisions by the caller's rate become multiplications.
-// Nothing is allocated.
 
 /// What TimeToHMSF gives of one time.
 struct TimecodeFields
