@@ -8,13 +8,12 @@
 ///
 ///     kFrameRate_VideoNTSC * 2;      // kFrameRate_VideoNTSC_HD
 ///     kFrameRate_VideoPAL_HD / 2;    // kFrameRate_VideoPAL
-///
-/// No operation but the stream operators allocates memory, and each is a few instructions.
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Export.h"
 
+#include <array>
 #include <cstdint>
 #include <iosfwd>
 #include <limits>
@@ -69,7 +68,7 @@ private:
 /// The rate of inFrames frames every inSeconds seconds. Does not compile when one frame is not a whole number of ticks.
 ///
 /// A rate whose terms a file states is FrameRate(kTicksPerSecond * seconds / frames), exact where that division leaves no
-/// remainder; TimeBase::FromRatio(seconds, frames) of interop/TimeBase.h checks and rounds for any two terms. A rate that
+/// remainder; TimeBase::FromRatio(seconds, frames) of TimeBase.h checks and rounds for any two terms. A rate that
 /// is stated as a decimal number, such as 29.97, stands for the nearest of AllFrameRates().
 consteval FrameRate FramesPerSecond(std::int64_t inFrames, std::int64_t inSeconds = 1)
 {
@@ -80,32 +79,64 @@ consteval FrameRate FramesPerSecond(std::int64_t inFrames, std::int64_t inSecond
 
 // ---- Named rates -----------------------------------------------------------------------------------------------------
 
+namespace detail
+{
+
+struct NamedRate
+{
+	std::int64_t mFrames;
+	std::int64_t mSeconds = 1;
+	unsigned mDecimals = 2;   ///< in its text, at most
+};
+
 // clang-format off
-inline constexpr FrameRate kFrameRate_Video10      = FramesPerSecond(10);
-inline constexpr FrameRate kFrameRate_Video12      = FramesPerSecond(12);
-inline constexpr FrameRate kFrameRate_Video12_5    = FramesPerSecond(25, 2);
-inline constexpr FrameRate kFrameRate_Video15      = FramesPerSecond(15);
-inline constexpr FrameRate kFrameRate_23976        = FramesPerSecond(24'000, 1'001);
-inline constexpr FrameRate kFrameRate_Film24       = FramesPerSecond(24);
-inline constexpr FrameRate kFrameRate_VideoPAL     = FramesPerSecond(25);
-inline constexpr FrameRate kFrameRate_VideoNTSC    = FramesPerSecond(30'000, 1'001);
-inline constexpr FrameRate kFrameRate_Video30      = FramesPerSecond(30);
-inline constexpr FrameRate kFrameRate_Film48       = FramesPerSecond(48);
-inline constexpr FrameRate kFrameRate_VideoPAL_HD  = FramesPerSecond(50);
-inline constexpr FrameRate kFrameRate_VideoNTSC_HD = FramesPerSecond(60'000, 1'001);
-inline constexpr FrameRate kFrameRate_Video60      = FramesPerSecond(60);
-inline constexpr FrameRate kFrameRate_Video100     = FramesPerSecond(100);
-inline constexpr FrameRate kFrameRate_Video1000    = FramesPerSecond(1'000);     ///< one frame is one millisecond
-inline constexpr FrameRate kFrameRate_Audio8000    = FramesPerSecond(8'000);     ///< the slowest audio rate: slower ones are video
-inline constexpr FrameRate kFrameRate_Audio11025   = FramesPerSecond(11'025);
-inline constexpr FrameRate kFrameRate_Audio22050   = FramesPerSecond(22'050);
-inline constexpr FrameRate kFrameRate_Audio32000   = FramesPerSecond(32'000);
-inline constexpr FrameRate kFrameRate_Audio44100   = FramesPerSecond(44'100);
-inline constexpr FrameRate kFrameRate_Audio48000   = FramesPerSecond(48'000);
-inline constexpr FrameRate kFrameRate_Audio88200   = FramesPerSecond(88'200);
-inline constexpr FrameRate kFrameRate_Audio96000   = FramesPerSecond(96'000);
-inline constexpr FrameRate kFrameRate_Audio192000  = FramesPerSecond(192'000);
-inline constexpr FrameRate kFrameRate_Zero;                                      ///< no rate: one frame lasts for ever
+/// The list of them, from which AllFrameRates() comes, too.
+inline constexpr auto kNamedRates = std::to_array<NamedRate>({
+	{10}, {12}, {25, 2}, {15}, {24'000, 1'001, 3}, {24}, {25}, {30'000, 1'001}, {30}, {48}, {50}, {60'000, 1'001}, {60},
+	{100}, {1'000},
+	{8'000}, {11'025}, {22'050}, {32'000}, {44'100}, {48'000}, {88'200}, {96'000}, {192'000},
+});
+// clang-format on
+
+/// A rate of the list. Does not compile for another, so that the list has every rate that is named here.
+consteval FrameRate Named(std::int64_t inFrames, std::int64_t inSeconds = 1)
+{
+	for (const NamedRate& row : kNamedRates)
+	{
+		if (row.mFrames == inFrames && row.mSeconds == inSeconds)
+			return FramesPerSecond(inFrames, inSeconds);
+	}
+	throw "this rate is not in the list of named rates";
+}
+
+}   // namespace detail
+
+// clang-format off
+inline constexpr FrameRate kFrameRate_Video10      = detail::Named(10);
+inline constexpr FrameRate kFrameRate_Video12      = detail::Named(12);
+inline constexpr FrameRate kFrameRate_Video12_5    = detail::Named(25, 2);
+inline constexpr FrameRate kFrameRate_Video15      = detail::Named(15);
+inline constexpr FrameRate kFrameRate_23976        = detail::Named(24'000, 1'001);
+inline constexpr FrameRate kFrameRate_Film24       = detail::Named(24);
+inline constexpr FrameRate kFrameRate_VideoPAL     = detail::Named(25);
+inline constexpr FrameRate kFrameRate_VideoNTSC    = detail::Named(30'000, 1'001);
+inline constexpr FrameRate kFrameRate_Video30      = detail::Named(30);
+inline constexpr FrameRate kFrameRate_Film48       = detail::Named(48);
+inline constexpr FrameRate kFrameRate_VideoPAL_HD  = detail::Named(50);
+inline constexpr FrameRate kFrameRate_VideoNTSC_HD = detail::Named(60'000, 1'001);
+inline constexpr FrameRate kFrameRate_Video60      = detail::Named(60);
+inline constexpr FrameRate kFrameRate_Video100     = detail::Named(100);
+inline constexpr FrameRate kFrameRate_Video1000    = detail::Named(1'000);      ///< one frame is one millisecond
+inline constexpr FrameRate kFrameRate_Audio8000    = detail::Named(8'000);      ///< the slowest audio rate: slower ones are video
+inline constexpr FrameRate kFrameRate_Audio11025   = detail::Named(11'025);
+inline constexpr FrameRate kFrameRate_Audio22050   = detail::Named(22'050);
+inline constexpr FrameRate kFrameRate_Audio32000   = detail::Named(32'000);
+inline constexpr FrameRate kFrameRate_Audio44100   = detail::Named(44'100);
+inline constexpr FrameRate kFrameRate_Audio48000   = detail::Named(48'000);
+inline constexpr FrameRate kFrameRate_Audio88200   = detail::Named(88'200);
+inline constexpr FrameRate kFrameRate_Audio96000   = detail::Named(96'000);
+inline constexpr FrameRate kFrameRate_Audio192000  = detail::Named(192'000);
+inline constexpr FrameRate kFrameRate_Zero;                                     ///< no rate: one frame lasts for ever
 // clang-format on
 
 /// All named rates in the order above, kFrameRate_Zero last.

@@ -7,10 +7,12 @@ if(NOT ZON_HAS_FMA_OPTION)
 endif()
 
 foreach(name ContractionOff ContractionOn)
-	add_executable(${name} contraction/ContractionCase.cpp "${zonmediatypes_SOURCE_DIR}/zonmediatypes/src/sampleclock/BarsAndBeats.cpp")
+	add_executable(${name} contraction/ContractionCase.cpp
+		"${zonmediatypes_SOURCE_DIR}/zonmediatypes/src/sampleclock/BarsAndBeats.cpp"
+		"${zonmediatypes_SOURCE_DIR}/zonmediatypes/src/sampleclock/Misuse.cpp")
 	zon_target_defaults(${name})
 	target_link_libraries(${name} PRIVATE zoncore::zoncore)
-	target_compile_definitions(${name} PRIVATE ZONMEDIATYPES_STATIC)   # its one source is linked in as it is
+	target_compile_definitions(${name} PRIVATE ZONMEDIATYPES_STATIC)   # its sources are linked in as they are
 	target_compile_options(${name} PRIVATE -O2 -mfma)
 	add_test(NAME FloatingPoint.${name} COMMAND ${name})
 	set_tests_properties(FloatingPoint.${name} PROPERTIES SKIP_RETURN_CODE 77)

@@ -37,7 +37,7 @@ int ReadInteger(UTF16StringView inText)
 	return value;
 }
 
-// What stands behind the first "." of inText, in beats.
+// What follows the first "." of inText, in beats.
 double ReadSubBeat(UTF16StringView inText, std::int32_t inTicksPerBeat)
 {
 	const std::size_t point = inText.find('.');
@@ -49,7 +49,7 @@ double ReadSubBeat(UTF16StringView inText, std::int32_t inTicksPerBeat)
 	return value;
 }
 
-// The beats in front of the one that inText begins; the part behind "." left out.
+// The beats before the one that inText names; what follows "." left out.
 std::int32_t ReadWholeBeats(UTF16StringView inText, std::int32_t inBeatsPerBar, bool inIsDuration)
 {
 	const std::int32_t base = inIsDuration ? 0 : 1;
@@ -91,7 +91,7 @@ Ticks SplitTicks(double inFraction, std::int32_t inTicksPerBeat)
 MusicalPosition SplitBeats(double inBeats, const BeatInfo& inBeatInfo, std::int64_t inBase)
 {
 	const std::int64_t beatsPerBar = inBeatInfo.iBeatsPerBar;
-	// Positions before the first bar are moved behind it by whole bars, which are taken off the bar number again.
+	// Positions before the first bar are moved after it by whole bars, which are taken off the bar number again.
 	const std::int64_t movedBars
 		= inBeats < 0 ? WrappingAdd(TruncateTo<std::int64_t>(-inBeats / inBeatInfo.iBeatsPerBar), 1) : 0;
 	const double beats = inBeats + static_cast<double>(WrappingMultiply(movedBars, beatsPerBar));
@@ -103,7 +103,7 @@ MusicalPosition SplitBeats(double inBeats, const BeatInfo& inBeatInfo, std::int6
 		SplitTicks(fraction, inBeatInfo.iTicksPerBeat)};
 }
 
-// The bar and, without a separator, the beat with decimals; every character behind the first "." becomes a "0".
+// The bar and, without a separator, the beat with decimals; every character after the first "." becomes a "0".
 void PutDecimalBeats(PositionText& ioText, const MusicalPosition& inPosition)
 {
 	const auto thousandths = TruncateTo<std::int64_t>(inPosition.mFraction * 1'000);
@@ -163,15 +163,7 @@ bool PutBarsAndBeats(PositionText& ioText, double inSamples, double inSampleRate
 	bool inIsDuration, std::int32_t inStyle)
 {
 	if (inBeatInfo.iBeatsPerBar == 0)
-	{
-		constexpr int kKnownLine = 980;   // the number that hosts know this place by
-		static constinit std::atomic<bool> sDisabled = false;
-		ReportMisuse(sDisabled, "inBeatInfo.iBeatsPerBar != 0", "programmer error!",
-			"bool zonmediatypes::utility::ConvertSamplesToBarsAndBeats(zoncore::UTF16String &, double, double, "
-			"const BeatInfo &, bool, int)",
-			kKnownLine);
-		return false;
-	}
+		return ReportMisuse(Misuse::NoBeatsPerBar);
 
 	const double offset = std::floor(inBeatInfo.dOffsetMilliseconds * inSampleRate / 1'000.0 + 0.5);
 	const double samples = inIsDuration ? inSamples : inSamples - offset;

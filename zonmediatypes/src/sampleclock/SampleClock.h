@@ -1,11 +1,9 @@
 #pragma once
 
-#include "zoncore/Debug.h"
 #include "zoncore/SourcePlace.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 #include "zonmediatypes/src/TextWriter.h"
 
-#include <atomic>
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
@@ -68,22 +66,25 @@ std::size_t WriteText(std::span<Char> outText, Put inPut, const Arguments&... in
 	return PutText(text, inPut, inArguments...) ? CopyText(text.GetText(), outText) : 0;
 }
 
-/// The part of inValue behind the point, with its sign; exact.
+/// The part of inValue after the point, with its sign; exact.
 inline double Fraction(double inValue) noexcept
 {
 	return inValue - std::trunc(inValue);
 }
 
-/// Tells the host's assert dialog of misuse, unless the user has switched the calling place off, and stops in an
-/// attached debugger when the dialog asks for that. Hosts know these places by the file of the conversions' entry
-/// points.
-inline void ReportMisuse(std::atomic<bool>& ioDisabled, const char* inCondition, const char* inMessage,
-	const char* inFunction, int inLine = zoncore::debug::SourceLine())
+/// What callers can do wrong. Each is a place of its own, which the user can switch off in the assert dialog.
+enum class Misuse : std::uint8_t
 {
-	const bool wantsBreak = zoncore::debug::BreakAfterAssertDialog(
-		ioDisabled, inCondition, inMessage, "zonmediatypes/src/TimeConversionUtils.cpp", inLine, inFunction, true);
-	if (wantsBreak && zoncore::debug::IsDebuggerAttached())
-		zoncore::debug::Break();
-}
+	ReadBeats,   ///< without a BeatInfo, as the next three
+	ReadBarsAndBeats,
+	WriteBeats,
+	WriteBarsAndBeats,
+	DropFrameNTSC,   ///< both at once
+	NoBeatsPerBar
+};
+
+/// Tells the host's assert dialog of misuse, unless the user has switched the place off, and stops in an attached debugger
+/// when the dialog asks for that. False, for callers to pass on.
+bool ReportMisuse(Misuse inMisuse, int inLine = zoncore::debug::SourceLine());
 
 }   // namespace zonmediatypes::utility

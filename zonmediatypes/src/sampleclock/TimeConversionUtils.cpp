@@ -92,13 +92,6 @@ constexpr const FormatRow& FindFormat(TimecodeFormat inFormat)
 	return sFormats[inFormat < sFormats.size() ? inFormat : kTimecodeFormat_None];
 }
 
-bool ReportMissingBeatInfo(
-	std::atomic<bool>& ioDisabled, const char* inFunction, int inLine = zoncore::debug::SourceLine())
-{
-	ReportMisuse(ioDisabled, "inBeatInfo", "programmer error!\n", inFunction, inLine);
-	return false;
-}
-
 // ---- Text to samples -------------------------------------------------------------------------------------------------
 
 // The numbers that text carries; mSubframes / mSubframeDivisor is a fraction of one frame.
@@ -146,7 +139,7 @@ TypedFields ParseTimeCodeString(UTF16StringView inText)
 {
 	constexpr std::size_t kLabels = 4;
 	constexpr std::size_t kMostFields = 5;
-	// Fields stand behind zeros: the four values in front of any end are right-aligned labels.
+	// Fields follow zeros: the four values before any end are right-aligned labels.
 	std::array<std::int32_t, kLabels + kMostFields> values{};
 	std::size_t end = kLabels;
 	std::size_t lastFieldLength = 0;   // with all that follows in the text
@@ -198,7 +191,7 @@ std::int32_t CountDropFrames(const TypedFields& inFields, std::int32_t inFrameRa
 	return WrappingAdd(blocks, WrappingSubtract(rest, WrappingMultiply(droppedPerMinute, minutes)));
 }
 
-// The first sample at or behind a frame and a fraction of it. Wraps, but beyond the range of the integer formula the
+// The first sample at or after a frame and a fraction of it. Wraps, but beyond the range of the integer formula the
 // result is that of doubles.
 std::int64_t FramesToSamples(std::int32_t inFrames, const TypedFields& inFields, std::int32_t inSampleRate,
 	std::int32_t inFrameRate, bool inNTSC)
@@ -240,23 +233,14 @@ std::int64_t ReadSampleCount(UTF16StringView inText)
 
 // ---- Samples to text -------------------------------------------------------------------------------------------------
 
-// The magnitude of a position in frames, mNumerator / mDenominator.
-struct FramePosition
-{
-	std::uint64_t mNumerator;
-	std::uint64_t mDenominator;
-
-	std::uint64_t GetFrames() const { return mNumerator / mDenominator; }
-	std::uint64_t GetHundredths() const { return mNumerator * 100 / mDenominator; }
-};
-
-FramePosition SamplesToFrames(
-	std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
+// The magnitude of a position, in inParts parts of a frame.
+std::uint64_t SamplesToFrames(std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
+	const TimecodeStyle& inStyle, std::uint64_t inParts = 1)
 {
 	const bool isScaled = inStyle.mDropFrame || inStyle.mNTSC;
 	const auto frameRate = static_cast<std::uint64_t>(inFrameRate) * (isScaled ? kNTSCNumerator : 1);
 	const auto sampleRate = static_cast<std::uint64_t>(inSampleRate) * (isScaled ? kNTSCDenominator : 1);
-	return {Magnitude(inSamples) * frameRate, sampleRate};
+	return Magnitude(inSamples) * frameRate * inParts / sampleRate;
 }
 
 // Rates that positions can be divided by: frames per hour, and with them those per minute, are 32-bit, wrapping, and not 0.
@@ -301,16 +285,14 @@ void PutField(PositionText& ioText, std::uint64_t inValue, bool& ioSuppresses, s
 	ioSuppresses = false;
 }
 
-void PutNonDrop(
-	PositionText& ioText, const FramePosition& inPosition, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
+void PutNonDrop(PositionText& ioText, std::uint64_t inFrames, std::int32_t inFrameRate, const TimecodeStyle& inStyle)
 {
 	const auto perSecond = static_cast<std::uint32_t>(inFrameRate);
 	const std::uint32_t perMinute = perSecond * 60;
 	const std::uint32_t perHour = perSecond * 3'600;
-	const std::uint64_t total = inPosition.GetFrames();
-	const std::uint64_t hours = total / perHour;
-	const std::uint64_t minutes = total % perHour / perMinute;
-	const std::uint64_t rest = total % perHour % perMinute;
+	const std::uint64_t hours = inFrames / perHour;
+	const std::uint64_t minutes = inFrames % perHour / perMinute;
+	const std::uint64_t rest = inFrames % perHour % perMinute;
 
 	bool suppresses = inStyle.mSuppressLeadingZeros;
 	if (!inStyle.mTotalMinutes)
@@ -320,10 +302,6 @@ void PutNonDrop(
 		return ioText.PutNumber(rest / perSecond, 2);
 	PutField(ioText, rest / perSecond, suppresses);
 	ioText.PutNumber(rest % perSecond, suppresses ? 1 : PaddedDigits(inFrameRate));
-	if (!inStyle.mShowSubframes)
-		return;
-	ioText.Put('.');
-	ioText.PutNumber(inPosition.GetHundredths() % 100, 2);
 }
 
 void PutTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, std::int32_t inFrameRate,
@@ -333,15 +311,18 @@ void PutTimecode(PositionText& ioText, std::int64_t inSamples, std::int32_t inSa
 		return ioText.Put('0');
 	if (inStyle.mDropFrame && inStyle.mFrameCountOnly)
 		return ioText.PutNumber(EstimateDropFrameCount(inSamples, inSampleRate, inFrameRate));
-	const FramePosition position = SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle);
+	const std::uint64_t frames = SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle);
 	if (inStyle.mFrameCountOnly)
-		return ioText.PutNumber(static_cast<std::int32_t>(position.GetFrames()));
+		return ioText.PutNumber(static_cast<std::int32_t>(frames));
 	if (inSamples < 0)
 		ioText.Put('-');
 	if (inStyle.mDropFrame)
-		PutDropFrame(ioText, position.GetFrames(), inFrameRate);
-	else
-		PutNonDrop(ioText, position, inFrameRate, inStyle);
+		return PutDropFrame(ioText, frames, inFrameRate);
+	PutNonDrop(ioText, frames, inFrameRate, inStyle);
+	if (!inStyle.mShowSubframes || inStyle.mOmitFrames)
+		return;
+	ioText.Put('.');
+	ioText.PutNumber(SamplesToFrames(inSamples, inSampleRate, inFrameRate, inStyle, 100) % 100, 2);
 }
 
 void PutDecimalFraction(PositionText& ioText, std::uint64_t inSeconds, std::uint64_t inRest, std::int32_t inSampleRate)
@@ -392,9 +373,6 @@ void PutMilliseconds(PositionText& ioText, std::int64_t inSamples, std::int32_t 
 bool PutPosition(PositionText& ioText, std::int64_t inSamples, std::int32_t inSampleRate, const FormatRow& inFormat,
 	std::int32_t inFrameRate, const BeatInfo* inBeatInfo, bool inIsDuration)
 {
-	constexpr const char* kSignature
-		= "bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
-		  "TimecodeFormat, std::int32_t, const BeatInfo *, bool)";
 	switch (inFormat.mKind)
 	{
 	case TextKind::Decimal:
@@ -411,18 +389,12 @@ bool PutPosition(PositionText& ioText, std::int64_t inSamples, std::int32_t inSa
 		break;
 	case TextKind::Beats:
 		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
+			return ReportMisuse(Misuse::WriteBeats);
 		PutBeats(ioText, inSamples, inSampleRate, inBeatInfo->dTempo);
 		break;
 	case TextKind::BarsAndBeats:
 		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
+			return ReportMisuse(Misuse::WriteBarsAndBeats);
 		return PutBarsAndBeats(ioText, static_cast<double>(inSamples), inSampleRate, *inBeatInfo, inIsDuration, 2);
 	case TextKind::None:
 		break;
@@ -449,9 +421,6 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inTimeco
 bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, TimecodeFormat inFormat,
 	std::int32_t inSampleRate, std::int32_t inFrameRate, BeatInfo* inBeatInfo, bool inIsDuration)
 {
-	constexpr const char* kSignature
-		= "bool zonmediatypes::utility::ConvertTimecodeToSamples(std::int64_t &, const zoncore::UTF16String &, "
-		  "TimecodeFormat, std::int32_t, std::int32_t, BeatInfo *, bool)";
 	if (inText.empty())
 	{
 		outSamples = kNoPosition;
@@ -474,18 +443,12 @@ bool ConvertTimecodeToSamples(std::int64_t& outSamples, UTF16StringView inText, 
 			format.mStyle.mNTSC || format.mStyle.mDropFrame, format.mStyle.mDropFrame);
 	case TextKind::Beats:
 		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
+			return ReportMisuse(Misuse::ReadBeats);
 		outSamples = TruncateTo<std::int64_t>(ReadDecimal(inText) * (inSampleRate * 60.0 / inBeatInfo->dTempo) + 0.5);
 		return true;
 	case TextKind::BarsAndBeats:
 		if (!inBeatInfo)
-		{
-			static constinit std::atomic<bool> sDisabled = false;
-			return ReportMissingBeatInfo(sDisabled, kSignature);
-		}
+			return ReportMisuse(Misuse::ReadBarsAndBeats);
 		outSamples = ConvertBarsAndBeatsToSamples(inText, inSampleRate, *inBeatInfo, inIsDuration);
 		return true;
 	case TextKind::None:
@@ -523,13 +486,7 @@ bool ConvertSamplesToTimecode(UTF16String& outText, std::int64_t inSamples, std:
 	bool inSuppressLeadingZeros, bool inShowSubframes, bool inTotalMinutes)
 {
 	if (inDropFrame && inNTSC)
-	{
-		static constinit std::atomic<bool> sDisabled = false;
-		ReportMisuse(sDisabled, "false", "ConvertSamplesToTimecode programmer error!",
-			"bool zonmediatypes::utility::ConvertSamplesToTimecode(zoncore::UTF16String &, std::int64_t, std::int32_t, "
-			"std::int32_t, bool, bool, bool, bool, bool, bool, bool)");
-		return false;
-	}
+		return ReportMisuse(Misuse::DropFrameNTSC);
 	const TimecodeStyle style{
 		inDropFrame, inNTSC, inFrameCountOnly, inOmitFrames, inSuppressLeadingZeros, inShowSubframes, inTotalMinutes};
 	return SetText(outText, PutTimecode, inSamples, inSampleRate, inFrameRate, style);
@@ -547,32 +504,20 @@ std::int64_t DropFrameToHMSF(std::int64_t inFrame, std::int32_t inFrameRate, std
 	if (inFrameRate < kLowestDropFrameRate)
 		return 0;
 	const auto multiple = static_cast<std::uint64_t>(inFrameRate / kLowestDropFrameRate);
-	const DropFrameCount count{30 * multiple, 2 * multiple};
-	std::uint64_t rest = Magnitude(inFrame);
-	if (rest >= count.PerHour())
-	{
-		outHours = static_cast<std::uint32_t>(rest / count.PerHour());
-		rest %= count.PerHour();
-	}
-	if (rest >= count.PerTenMinutes())
-	{
-		outMinutes = static_cast<std::uint32_t>(rest / count.PerTenMinutes() * 10);
-		rest %= count.PerTenMinutes();
-	}
-	if (rest >= count.PerFullMinute())
-	{
-		// The rest keeps the labels that the short minutes drop, so that it splits into seconds and frames as usual.
-		const std::uint64_t shortMinutes = (rest - count.PerFullMinute()) / count.PerShortMinute() + 1;
-		outMinutes += static_cast<std::uint32_t>(shortMinutes);
-		rest -= shortMinutes * count.PerShortMinute();
-	}
-	std::uint64_t seconds = 0;
-	if (rest >= count.mNominal)
-	{
-		seconds = rest / count.mNominal;
+	const DropFrameCount count = DropFrameCount::Dropping(multiple * kLowestDropFrameRate);
+	const std::uint64_t labels = count.LabelOf(Magnitude(inFrame));
+	const std::uint64_t allSeconds = labels / count.mNominal;
+	const std::uint64_t hours = allSeconds / 3'600;
+	const auto minutes = static_cast<std::uint32_t>(allSeconds / 60 % 60);
+	const std::uint64_t seconds = allSeconds % 60;
+	if (hours != 0)
+		outHours = static_cast<std::uint32_t>(hours);
+	if (minutes >= 10)
+		outMinutes = minutes / 10 * 10;
+	outMinutes += minutes % 10;
+	if (seconds != 0)
 		outSeconds = static_cast<std::uint32_t>(seconds);
-	}
-	outFrames = static_cast<std::uint32_t>(rest % count.mNominal);
+	outFrames = static_cast<std::uint32_t>(labels - allSeconds * count.mNominal);
 	return static_cast<std::int64_t>(seconds);
 }
 

@@ -4,6 +4,7 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/src/time/RateText.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 #include <string>
@@ -15,33 +16,23 @@ namespace
 
 using zoncore::UTF16String;
 
-constexpr auto sFrameRates = std::to_array<FrameRate>({
-	kFrameRate_Video10,
-	kFrameRate_Video12,
-	kFrameRate_Video12_5,
-	kFrameRate_Video15,
-	kFrameRate_23976,
-	kFrameRate_Film24,
-	kFrameRate_VideoPAL,
-	kFrameRate_VideoNTSC,
-	kFrameRate_Video30,
-	kFrameRate_Film48,
-	kFrameRate_VideoPAL_HD,
-	kFrameRate_VideoNTSC_HD,
-	kFrameRate_Video60,
-	kFrameRate_Video100,
-	kFrameRate_Video1000,
-	kFrameRate_Audio8000,
-	kFrameRate_Audio11025,
-	kFrameRate_Audio22050,
-	kFrameRate_Audio32000,
-	kFrameRate_Audio44100,
-	kFrameRate_Audio48000,
-	kFrameRate_Audio88200,
-	kFrameRate_Audio96000,
-	kFrameRate_Audio192000,
-	kFrameRate_Zero,
-});
+using detail::kNamedRates;
+using detail::NamedRate;
+
+constexpr auto sFrameRates = []
+{
+	std::array<FrameRate, kNamedRates.size() + 1> rates{};   // kFrameRate_Zero is the last one
+	std::ranges::transform(kNamedRates, rates.begin(),
+		[](const NamedRate& inRow) { return FrameRate(kTicksPerSecond * inRow.mSeconds / inRow.mFrames); });
+	return rates;
+}();
+
+unsigned long Decimals(FrameRate inRate)
+{
+	constexpr unsigned kUsual = NamedRate{}.mDecimals;
+	const auto row = static_cast<std::size_t>(std::ranges::find(sFrameRates, inRate) - sFrameRates.begin());
+	return row < kNamedRates.size() ? kNamedRates[row].mDecimals : kUsual;
+}
 
 // A duration of 0 is written as the rate "inf".
 double WrittenFramesPerSecond(FrameRate inRate)
@@ -53,13 +44,12 @@ double WrittenFramesPerSecond(FrameRate inRate)
 
 }   // namespace
 
-// Two decimals tell all named rates apart but 23.976 and 24 fps, which people know by three.
 UTF16String RateText(FrameRate inRate)
 {
 	constexpr std::size_t kMinIntegerDigits = 1;
 	constexpr int kMaxLength = 31;
-	return zoncore::utility::NumberToString(WrittenFramesPerSecond(inRate), kMinIntegerDigits,
-		inRate == kFrameRate_23976 ? 3 : 2, zoncore::utility::kNumberFlag_DropTrailingZeros, kMaxLength);
+	return zoncore::utility::NumberToString(WrittenFramesPerSecond(inRate), kMinIntegerDigits, Decimals(inRate),
+		zoncore::utility::kNumberFlag_DropTrailingZeros, kMaxLength);
 }
 
 std::span<const FrameRate> AllFrameRates() noexcept

@@ -55,13 +55,14 @@ constexpr CadenceRow FindCadence(PulldownCadence inCadence)
 	return index < sCadences.size() ? sCadences[index] : sCadences[kPulldownCadence_None];
 }
 
-// 4/5 of a video rate, through double: exact to the tick at the rates that film is carried at.
+// The rate of the film in a video, through double: exact to the tick at the rates that film is carried at.
 FrameRate FilmRate(FrameRate inVideoRate)
 {
 	constexpr auto kSecond = static_cast<double>(kTicksPerSecond);
 	if (inVideoRate == kFrameRate_Zero)
 		return kFrameRate_Zero;
-	const double framesPerSecond = kSecond / static_cast<double>(inVideoRate.GetTicksPerFrame()) * 4.0 / 5.0;
+	const double framesPerSecond = kSecond / static_cast<double>(inVideoRate.GetTicksPerFrame())
+		* static_cast<double>(kFilmFrames) / static_cast<double>(kVideoFrames);
 	return FrameRate(zoncore::utility::TruncateTo<std::int64_t>(kSecond / framesPerSecond));
 }
 

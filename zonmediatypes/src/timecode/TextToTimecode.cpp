@@ -44,14 +44,15 @@ constexpr bool IsFilmSeparator(UTF16Char inChar)
 // The groups of digits of a text, from the right; those that are missing are 0.
 struct TextFields
 {
-	HMSF mFields{};
+	TimecodeFields mFields{};
 	int mGroups = 1;
 };
 
 // Four groups of two digits, read without a branch for every character. False for all other text.
-bool ReadUsualFields(UTF16StringView inText, TextFields& outFields)
+bool ReadFullForm(UTF16StringView inText, TextFields& outFields)
 {
-	if (inText.size() != kUsualLength || !IsSeparator(inText[2]) || !IsSeparator(inText[5]) || !IsSeparator(inText[8]))
+	if (inText.size() != kFullFormLength || !IsSeparator(inText[2]) || !IsSeparator(inText[5])
+		|| !IsSeparator(inText[8]))
 		return false;
 	bool isNumber = true;
 	const auto read = [&](std::size_t inAt)
@@ -62,7 +63,7 @@ bool ReadUsualFields(UTF16StringView inText, TextFields& outFields)
 		isNumber &= ones < 10;
 		return tens * 10 + ones;
 	};
-	const TextFields fields{{read(0), read(3), read(6), read(9)}, 4};
+	const TextFields fields{{read(0), read(3), read(6), false, read(9)}, 4};
 	if (isNumber)
 		outFields = fields;
 	return isNumber;
@@ -74,7 +75,7 @@ bool ReadFields(UTF16StringView inText, TextFields& outFields)
 	constexpr std::uint64_t kMostFrames = std::numeric_limits<std::uint32_t>::max();
 	constexpr int kMostGroups = 4;
 	TextFields read;
-	HMSF& fields = read.mFields;
+	TimecodeFields& fields = read.mFields;
 	bool isAfterSeparator = true;
 	for (const UTF16Char character : inText)
 	{
@@ -86,7 +87,7 @@ bool ReadFields(UTF16StringView inText, TextFields& outFields)
 		}
 		if (!IsSeparator(character) || isAfterSeparator || ++read.mGroups > kMostGroups)
 			return false;
-		fields = {fields.mMinutes, fields.mSeconds, static_cast<std::uint32_t>(fields.mFrames), 0};
+		fields = {fields.mMinutes, fields.mSeconds, static_cast<std::uint32_t>(fields.mFrames), false, 0};
 		isAfterSeparator = true;
 	}
 	outFields = read;
@@ -94,7 +95,7 @@ bool ReadFields(UTF16StringView inText, TextFields& outFields)
 }
 
 // A run of digits, "HHMMSSFF"; how many of them are frames depends on the rate.
-HMSF SplitDigits(std::uint64_t inRun, FrameRate inRate)
+TimecodeFields SplitDigits(std::uint64_t inRun, FrameRate inRate)
 {
 	const std::int64_t duration = inRate.GetTicksPerFrame();
 	const std::uint32_t frames = duration >= kFrameRate_Video100.GetTicksPerFrame() ? 100
@@ -103,7 +104,7 @@ HMSF SplitDigits(std::uint64_t inRun, FrameRate inRate)
 																					: 100'000;
 	const auto run = static_cast<std::uint32_t>(inRun);
 	const std::uint32_t rest = run / frames;
-	return {rest / 10'000, rest / 100 % 100, rest % 100, run % frames};
+	return {rest / 10'000, rest / 100 % 100, rest % 100, false, run % frames};
 }
 
 TickTime ReadTimecode(UTF16StringView inText, FrameRate inRate, const TimeDisplayRow& inRow, TimecodeFlags inFlags)
@@ -113,18 +114,19 @@ TickTime ReadTimecode(UTF16StringView inText, FrameRate inRate, const TimeDispla
 	const bool hasLeadingSeparator = !magnitude.empty() && IsSeparator(magnitude.front());
 	const UTF16StringView groups = magnitude.substr(hasLeadingSeparator ? 1 : 0);
 	TextFields read;
-	if (groups.empty() || (!ReadUsualFields(groups, read) && !ReadFields(groups, read)))
+	if (groups.empty() || (!ReadFullForm(groups, read) && !ReadFields(groups, read)))
 		return kTime_Invalid;
 	const bool isCount = inRow.mKind == DisplayKind::Frames;
 	if (isCount && read.mGroups != 1)
 		return kTime_Invalid;
 
 	const FrameRate fieldRate = inRow.mKind == DisplayKind::Milliseconds ? inRow.mRate : inRate;
-	const HMSF fields = read.mGroups == 1 ? SplitDigits(read.mFields.mFrames, fieldRate) : read.mFields;
+	TimecodeFields fields = read.mGroups == 1 ? SplitDigits(read.mFields.mFrames, fieldRate) : read.mFields;
+	fields.mNegative = isNegative;
 	const auto count = static_cast<std::int64_t>(read.mFields.mFrames);
 	const TickTime time = read.mGroups == 1 && (isCount || hasLeadingSeparator)
 		? MovedByFrames(kTime_Zero, isNegative ? -count : count, inRate)
-		: FieldsToTime(fields, isNegative, fieldRate, inRow);
+		: FieldsToTime(fields, fieldRate, inRow);
 	return inFlags.Test(kTimecodeFlag_LastFrame) ? MovedByFrames(time, isNegative ? -1 : 1, inRate) : time;
 }
 

@@ -4,6 +4,7 @@
 #include "zonmediatypes/TimeDisplayUtils.h"
 #include "zonmediatypes/src/time/DropFrame.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
 #include <cstdint>
@@ -43,17 +44,20 @@ struct TimeDisplayRow
 	{
 		return mKind == DisplayKind::Frames || mKind == DisplayKind::Film || mKind == DisplayKind::Samples;
 	}
+
+	constexpr bool HasOwnRate() const noexcept { return mCount.mNominal != 0; }
 };
 
 /// A display that counts at a rate of its own. A second that is not a whole number of frames long is numbered as if the
-/// frame that it ends in were whole; drop-frame numbering makes up for that with two labels a short
-/// minute for every thirty in a second.
+/// frame that it ends in were whole.
 consteval TimeDisplayRow FixedRateDisplay(TimeDisplay inDisplay, FrameRate inRate,
 	FrameNumbering inNumbering = FrameNumbering::Straight, DisplayKind inKind = DisplayKind::Timecode)
 {
 	const std::int64_t duration = inRate.GetTicksPerFrame();
 	const auto nominal = static_cast<std::uint64_t>((kTicksPerSecond + duration - 1) / duration);
-	return {inDisplay, inKind, inRate, {nominal, inNumbering == FrameNumbering::Drop ? nominal / 15 : 0}, inNumbering};
+	const bool isDrop = inNumbering == FrameNumbering::Drop;
+	return {inDisplay, inKind, inRate, isDrop ? DropFrameCount::Dropping(nominal) : DropFrameCount{nominal, 0},
+		inNumbering};
 }
 
 consteval TimeDisplayRow FilmDisplay(TimeDisplay inDisplay, int inFramesPerFoot)
@@ -80,32 +84,30 @@ inline constexpr auto kTimeDisplayTable = std::to_array<TimeDisplayRow>({
 	{kTimeDisplay_AudioSamples, DisplayKind::Samples},
 	FixedRateDisplay(kTimeDisplay_Milliseconds, kFrameRate_Video1000, FrameNumbering::Straight, DisplayKind::Milliseconds),
 	{kTimeDisplay_Auto, DisplayKind::Auto},
+	{TimeDisplay{}, DisplayKind::None},
 });
 // clang-format on
+inline constexpr std::size_t kTimeDisplays = kTimeDisplayTable.size() - 1;   // without the last row
 
-inline constexpr TimeDisplayRow kNoTimeDisplay{TimeDisplay{}, DisplayKind::None};
-
-/// The row of inDisplay without a search: the displays are numbered in three runs. kNoTimeDisplay for other numbers.
-constexpr const TimeDisplayRow& FindTimeDisplay(TimeDisplay inDisplay) noexcept
+/// The place of a display's row without a search: the displays are numbered in three runs. The last row for other numbers.
+constexpr std::size_t PlaceOf(TimeDisplay inDisplay) noexcept
 {
 	constexpr std::size_t kVideoDisplays = kTimeDisplay_48Timecode - kTimeDisplay_24Timecode + 1;
 	if (inDisplay >= kTimeDisplay_24Timecode && inDisplay <= kTimeDisplay_48Timecode)
-		return kTimeDisplayTable[static_cast<std::size_t>(inDisplay - kTimeDisplay_24Timecode)];
+		return static_cast<std::size_t>(inDisplay - kTimeDisplay_24Timecode);
 	if (inDisplay == kTimeDisplay_AudioSamples)
-		return kTimeDisplayTable[kVideoDisplays];
+		return kVideoDisplays;
 	if (inDisplay == kTimeDisplay_Milliseconds)
-		return kTimeDisplayTable[kVideoDisplays + 1];
-	return inDisplay == kTimeDisplay_Auto ? kTimeDisplayTable[kVideoDisplays + 2] : kNoTimeDisplay;
+		return kVideoDisplays + 1;
+	return inDisplay == kTimeDisplay_Auto ? kVideoDisplays + 2 : kTimeDisplays;
 }
-
-static_assert(
-	[]
-	{
-		for (const TimeDisplayRow& row : kTimeDisplayTable)
-			if (&FindTimeDisplay(row.mDisplay) != &row)
-				return false;
-		return true;
-	}(),
+static_assert(std::ranges::all_of(kTimeDisplayTable,
+				  [](const TimeDisplayRow& inRow) { return &kTimeDisplayTable[PlaceOf(inRow.mDisplay)] == &inRow; }),
 	"the table is in the order in which the displays are numbered");
+
+constexpr const TimeDisplayRow& FindTimeDisplay(TimeDisplay inDisplay) noexcept
+{
+	return kTimeDisplayTable[PlaceOf(inDisplay)];
+}
 
 }   // namespace zonmediatypes

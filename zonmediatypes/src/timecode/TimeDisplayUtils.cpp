@@ -11,21 +11,18 @@ namespace
 
 constexpr auto sAllTimeDisplays = []
 {
-	std::array<TimeDisplay, kTimeDisplayTable.size()> displays{};
-	std::ranges::transform(kTimeDisplayTable, displays.begin(), &TimeDisplayRow::mDisplay);
+	std::array<TimeDisplay, kTimeDisplays> displays{};
+	std::ranges::transform(
+		kTimeDisplayTable.begin(), kTimeDisplayTable.end() - 1, displays.begin(), &TimeDisplayRow::mDisplay);
 	return displays;
 }();
 
-// Not the rates below 22,050 Hz: a host that shows those picks the display itself.
-constexpr auto sSampleDisplayRates = std::to_array<FrameRate>({
-	kFrameRate_Audio22050,
-	kFrameRate_Audio32000,
-	kFrameRate_Audio44100,
-	kFrameRate_Audio48000,
-	kFrameRate_Audio88200,
-	kFrameRate_Audio96000,
-	kFrameRate_Audio192000,
-});
+// A named rate of 22,050 Hz or more: a host that shows slower ones picks the display itself.
+bool IsShownInSamples(FrameRate inRate)
+{
+	return inRate.GetTicksPerFrame() <= kFrameRate_Audio22050.GetTicksPerFrame()
+		&& std::ranges::find(AllFrameRates(), inRate) != AllFrameRates().end();
+}
 
 }   // namespace
 
@@ -46,8 +43,7 @@ TimeDisplay GetTimeDisplayForFrameRate(
 	};
 	if (const auto row = std::ranges::find_if(kTimeDisplayTable, fits); row != kTimeDisplayTable.end())
 		return row->mDisplay;
-	return std::ranges::find(sSampleDisplayRates, inRate) != sSampleDisplayRates.end() ? kTimeDisplay_AudioSamples
-																					   : inDefault;
+	return IsShownInSamples(inRate) ? kTimeDisplay_AudioSamples : inDefault;
 }
 
 FrameRate GetFrameRateForTimeDisplay(TimeDisplay inDisplay, FrameRate inRate) noexcept

@@ -10,27 +10,28 @@ namespace zonmediatypes
 void TimeToHMSF(unsigned int& outHours, unsigned int& outMinutes, unsigned int& outSeconds,
 	unsigned long long& outFrames, bool& outNegative, TickTime inTime, FrameRate inRate, TimeDisplay inDisplay) noexcept
 {
-	const HMSF fields = FieldsOf(inTime, inRate, inDisplay);
+	const std::size_t place = PlaceOf(inDisplay);
+	const TimecodeFields fields = FieldsOf(inTime, inRate, place);
 	outHours = fields.mHours;
 	outMinutes = fields.mMinutes;
 	outSeconds = fields.mSeconds;
 	outFrames = fields.mFrames;
-	outNegative = inTime.GetTicks() <= LastNegativeTick(inRate, FindTimeDisplay(inDisplay));
+	outNegative = inTime.GetTicks() <= LastNegativeTick(inRate, kTimeDisplayTable[place]);
 }
 
 std::size_t TimesToHMSF(std::span<TimecodeFields> outFields, std::span<const TickTime> inTimes, FrameRate inRate,
 	TimeDisplay inDisplay) noexcept
 {
 	const std::size_t count = std::min(outFields.size(), inTimes.size());
-	const std::int64_t lastNegative = LastNegativeTick(inRate, FindTimeDisplay(inDisplay));
-	WithSplitter<zoncore::utility::Reciprocal>(inRate, inDisplay,
+	const std::size_t place = PlaceOf(inDisplay);
+	const std::int64_t lastNegative = LastNegativeTick(inRate, kTimeDisplayTable[place]);
+	WithSplitter<zoncore::utility::Reciprocal>(inRate, place,
 		[=](auto inSplit)
 		{
 			for (std::size_t i = 0; i < count; ++i)
 			{
-				const HMSF fields = inSplit(inTimes[i]);
-				outFields[i] = {fields.mHours, fields.mMinutes, fields.mSeconds, inTimes[i].GetTicks() <= lastNegative,
-					fields.mFrames};
+				outFields[i] = inSplit(inTimes[i]);
+				outFields[i].mNegative = inTimes[i].GetTicks() <= lastNegative;
 			}
 		});
 	return count;
@@ -39,7 +40,7 @@ std::size_t TimesToHMSF(std::span<TimecodeFields> outFields, std::span<const Tic
 TickTime HMSFToTime(unsigned int inHours, unsigned int inMinutes, unsigned int inSeconds, unsigned long long inFrames,
 	bool inNegative, FrameRate inRate, TimeDisplay inDisplay) noexcept
 {
-	return FieldsToTime({inHours, inMinutes, inSeconds, inFrames}, inNegative, inRate, FindTimeDisplay(inDisplay));
+	return FieldsToTime({inHours, inMinutes, inSeconds, inNegative, inFrames}, inRate, FindTimeDisplay(inDisplay));
 }
 
 }   // namespace zonmediatypes

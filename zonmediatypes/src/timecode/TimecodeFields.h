@@ -6,13 +6,16 @@
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
+#include "zonmediatypes/Timecode.h"
 #include "zonmediatypes/src/time/DropFrame.h"
 #include "zonmediatypes/src/timecode/TimeDisplayTable.h"
 
+#include <array>
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
 #include <limits>
+#include <utility>
 
 // Times as hours, minutes, seconds and frames, and back: what timecode in numbers and in text is made of.
 
@@ -20,7 +23,7 @@ namespace zonmediatypes
 {
 
 /// The characters of "HH:MM:SS:FF". Nearly all text has this form: it is written where it stays, and read without a loop.
-inline constexpr std::size_t kUsualLength = 11;
+inline constexpr std::size_t kFullFormLength = 11;
 
 // kTimeDisplay_Auto is for media: pulled-down rates are numbered with drop frames.
 inline TimeDisplay ChooseDisplay(TimeDisplay inDisplay, FrameRate inRate) noexcept
@@ -38,20 +41,29 @@ inline TickTime MovedByFrames(TickTime inTime, long long inFrames, FrameRate inR
 
 // ---- Time to fields --------------------------------------------------------------------------------------------------
 
-/// Splits times at a display with a rate of its own. The display is a template argument so that every division is by a
-/// constant.
-template <TimeDisplay inDisplay>
-struct FixedRateSplitter
+/// Splits a count of labels, of which inNominal last a second, where the whole seconds are known; up to 2^32 of them. Hours
+/// wrap at 24.
+constexpr TimecodeFields SplitSeconds(std::uint64_t inLabels, std::uint64_t inSeconds, std::uint64_t inNominal) noexcept
 {
-	HMSF operator()(TickTime inTime) const noexcept
+	// Remainders are made from their quotients: compilers divide again for `%`.
+	const auto seconds = static_cast<std::uint32_t>(inSeconds);
+	const std::uint32_t minutes = seconds / 60;
+	const std::uint32_t hours = minutes / 60;
+	return {hours < 24 ? hours : hours % 24, minutes - 60 * hours, seconds - 60 * minutes, false,
+		inLabels - inNominal * seconds};
+}
+
+/// Splits times at the display of a row with a rate of its own, one of the table so that every division is by a constant.
+template <std::size_t inRow>
+struct OwnRateSplitter
+{
+	TimecodeFields operator()(TickTime inTime) const noexcept
 	{
-		constexpr const TimeDisplayRow& kRow = FindTimeDisplay(inDisplay);
+		constexpr const TimeDisplayRow& kRow = kTimeDisplayTable[inRow];
 		const std::uint64_t frames = zoncore::utility::Magnitude(inTime.GetTicks())
 			/ static_cast<std::uint64_t>(kRow.mRate.GetTicksPerFrame());
-		if constexpr (kRow.mNumbering == FrameNumbering::Drop)
-			return SplitDropFrames(frames, kRow.mCount);
-		else
-			return SplitFrames(frames, kRow.mCount.mNominal);
+		const std::uint64_t labels = kRow.mCount.mDropped != 0 ? kRow.mCount.LabelOf(frames) : frames;
+		return SplitSeconds(labels, labels / kRow.mCount.mNominal, kRow.mCount.mNominal);
 	}
 };
 
@@ -79,7 +91,7 @@ public:
 	{
 	}
 
-	HMSF operator()(TickTime inTime) const noexcept
+	TimecodeFields operator()(TickTime inTime) const noexcept
 	{
 		const std::uint64_t frames = mTicksPerFrame.Divide(zoncore::utility::Magnitude(inTime.GetTicks()));
 		return SplitSeconds(frames, mFramesPerSecond.Divide(frames), mNominal);
@@ -101,10 +113,10 @@ public:
 	{
 	}
 
-	HMSF operator()(TickTime inTime) const noexcept
+	TimecodeFields operator()(TickTime inTime) const noexcept
 	{
 		const std::uint64_t frames = mTicksPerFrame.Divide(zoncore::utility::Magnitude(inTime.GetTicks()));
-		return {0, 0, 0, (inTime < kTime_Zero) != mIsBackwards ? 0 - frames : frames};
+		return {0, 0, 0, false, (inTime < kTime_Zero) != mIsBackwards ? 0 - frames : frames};
 	}
 
 private:
@@ -114,49 +126,44 @@ private:
 
 struct NoFields
 {
-	HMSF operator()(TickTime) const noexcept { return {}; }
+	TimecodeFields operator()(TickTime) const noexcept { return {}; }
 };
 
-// clang-format off
-/// Calls inUse with what splits times at a display.
-template <class AnyDivisor, class Use>
-auto WithSplitter(FrameRate inRate, TimeDisplay inDisplay, Use inUse)
+/// What inUse gives of what splits times at the display that has its row at inPlace of the table.
+template <std::size_t inPlace, class AnyDivisor, class Use>
+auto WithSplitterOf(FrameRate inRate, Use inUse)
 {
+	constexpr const TimeDisplayRow& kRow = kTimeDisplayTable[inPlace];
 	const std::int64_t duration = inRate.GetTicksPerFrame();
-	switch (inDisplay)
-	{
-	case kTimeDisplay_24Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_24Timecode>());
-	case kTimeDisplay_25Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_25Timecode>());
-	case kTimeDisplay_2997DropTimecode:    return inUse(FixedRateSplitter<kTimeDisplay_2997DropTimecode>());
-	case kTimeDisplay_2997NonDropTimecode: return inUse(FixedRateSplitter<kTimeDisplay_2997NonDropTimecode>());
-	case kTimeDisplay_30Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_30Timecode>());
-	case kTimeDisplay_50Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_50Timecode>());
-	case kTimeDisplay_5994DropTimecode:    return inUse(FixedRateSplitter<kTimeDisplay_5994DropTimecode>());
-	case kTimeDisplay_5994NonDropTimecode: return inUse(FixedRateSplitter<kTimeDisplay_5994NonDropTimecode>());
-	case kTimeDisplay_60Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_60Timecode>());
-	case kTimeDisplay_23976Timecode:       return inUse(FixedRateSplitter<kTimeDisplay_23976Timecode>());
-	case kTimeDisplay_48Timecode:          return inUse(FixedRateSplitter<kTimeDisplay_48Timecode>());
-	case kTimeDisplay_Milliseconds:        return inUse(FixedRateSplitter<kTimeDisplay_Milliseconds>());
-	case kTimeDisplay_16mmFeetFrames:
-	case kTimeDisplay_35mmFeetFrames:
-	case kTimeDisplay_AudioSamples:
-		if (duration >= 1 && duration <= kTicksPerSecond)
-			return inUse(CallersRateSplitter<AnyDivisor>(duration));
-		break;
-	case kTimeDisplay_Frames:
-		if (inRate.IsUsable())
-			return inUse(FrameCounter<AnyDivisor>(duration));
-		break;
-	case kTimeDisplay_Auto:
-		break;
-	}
-	return inUse(NoFields());
+	if constexpr (kRow.HasOwnRate())
+		return inUse(OwnRateSplitter<inPlace>());
+	else if constexpr (kRow.mKind == DisplayKind::Frames)
+		return inRate.IsUsable() ? inUse(FrameCounter<AnyDivisor>(duration)) : inUse(NoFields());
+	else if constexpr (kRow.CountsAtCallersRate())
+		return duration >= 1 && duration <= kTicksPerSecond ? inUse(CallersRateSplitter<AnyDivisor>(duration))
+															: inUse(NoFields());
+	else
+		return inUse(NoFields());
 }
-// clang-format on
 
-inline HMSF FieldsOf(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay) noexcept
+template <class AnyDivisor, class Use, std::size_t... inPlaces>
+constexpr auto MakeSplitterTable(std::index_sequence<inPlaces...>)
 {
-	return WithSplitter<Divisor>(inRate, inDisplay, [=](auto inSplit) { return inSplit(inTime); });
+	return std::array{&WithSplitterOf<inPlaces, AnyDivisor, Use>...};
+}
+
+/// The same for a place that is known at run time only.
+template <class AnyDivisor, class Use>
+auto WithSplitter(FrameRate inRate, std::size_t inPlace, Use inUse)
+{
+	static constexpr auto kSplitters
+		= MakeSplitterTable<AnyDivisor, Use>(std::make_index_sequence<kTimeDisplayTable.size()>());
+	return kSplitters[inPlace](inRate, inUse);
+}
+
+inline TimecodeFields FieldsOf(TickTime inTime, FrameRate inRate, std::size_t inPlace) noexcept
+{
+	return WithSplitter<Divisor>(inRate, inPlace, [=](auto inSplit) { return inSplit(inTime); });
 }
 
 /// The time that is negative and nearest to zero, in ticks. Where the fields are those of a frame number it is the number's
@@ -193,7 +200,7 @@ inline bool ExceedsSecond(std::uint64_t inFrames, FrameRate inRate) noexcept
 
 /// Takes whole seconds out of the frames. The count of frames in a second is that of the rate itself or of the next faster
 /// one with a whole number of frames in a second, formed through double as hosts form it.
-inline HMSF CarryFrames(HMSF inFields, FrameRate inRate) noexcept
+inline TimecodeFields CarryFrames(TimecodeFields inFields, FrameRate inRate) noexcept
 {
 	using zoncore::utility::TruncateTo;
 	const double perSecond = std::ceil(FramesPerSecondOf(inRate));
@@ -202,22 +209,22 @@ inline HMSF CarryFrames(HMSF inFields, FrameRate inRate) noexcept
 	const auto carry
 		= static_cast<std::uint64_t>(TruncateTo<std::int64_t>(static_cast<double>(inFields.mFrames) / nominal));
 	return {inFields.mHours, inFields.mMinutes, inFields.mSeconds + static_cast<std::uint32_t>(carry),
-		inFields.mFrames - carry * static_cast<std::uint64_t>(TruncateTo<std::int64_t>(nominal))};
+		inFields.mNegative, inFields.mFrames - carry * static_cast<std::uint64_t>(TruncateTo<std::int64_t>(nominal))};
 }
 
 /// Brings minutes and seconds below 60 and hours below 24, where they mostly are.
-inline HMSF CarrySeconds(HMSF inFields) noexcept
+inline TimecodeFields CarrySeconds(TimecodeFields inFields) noexcept
 {
 	if (inFields.mSeconds < 60 && inFields.mMinutes < 60 && inFields.mHours < 24)
 		return inFields;
 	const std::uint32_t minutes = inFields.mMinutes + inFields.mSeconds / 60;
 	const std::uint32_t hours = inFields.mHours + minutes / 60;
-	return {hours % 24, minutes % 60, inFields.mSeconds % 60, inFields.mFrames};
+	return {hours % 24, minutes % 60, inFields.mSeconds % 60, inFields.mNegative, inFields.mFrames};
 }
 
 /// The number of the frame that has these labels; without dropped labels they count up without a gap. The first label of a
 /// short minute is dropped with the next one; it alone counts as the frame that the minute begins with.
-inline std::uint64_t FrameNumber(HMSF inFields, DropFrameCount inCount) noexcept
+inline std::uint64_t FrameNumber(TimecodeFields inFields, DropFrameCount inCount) noexcept
 {
 	const std::uint64_t minutes = inFields.mHours * std::uint64_t{60} + inFields.mMinutes;   // [0, 1439]
 	const std::uint64_t shortMinutes = minutes - minutes / 10;
@@ -226,7 +233,7 @@ inline std::uint64_t FrameNumber(HMSF inFields, DropFrameCount inCount) noexcept
 	return inCount.mNominal * (minutes * 60 + inFields.mSeconds) + inFields.mFrames - dropped;
 }
 
-inline std::uint64_t CallersRateFrameNumber(HMSF inFields, FrameRate inRate, bool inRoundsSum) noexcept
+inline std::uint64_t CallersRateFrameNumber(TimecodeFields inFields, FrameRate inRate, bool inRoundsSum) noexcept
 {
 	using zoncore::utility::TruncateTo;
 	const std::uint32_t seconds = (inFields.mHours * 60 + inFields.mMinutes) * 60 + inFields.mSeconds;
@@ -236,16 +243,16 @@ inline std::uint64_t CallersRateFrameNumber(HMSF inFields, FrameRate inRate, boo
 	return static_cast<std::uint64_t>(TruncateTo<std::int64_t>(frames)) + inFields.mFrames;
 }
 
-inline TickTime FieldsToTime(HMSF inFields, bool inNegative, FrameRate inRate, const TimeDisplayRow& inRow) noexcept
+inline TickTime FieldsToTime(TimecodeFields inFields, FrameRate inRate, const TimeDisplayRow& inRow) noexcept
 {
-	const HMSF fields
+	const TimecodeFields fields
 		= CarrySeconds(ExceedsSecond(inFields.mFrames, inRate) ? CarryFrames(inFields, inRate) : inFields);
-	const bool hasOwnRate = inRow.mCount.mNominal != 0;
 	const FrameRate rate = inRow.CountsAtCallersRate() ? inRate : inRow.mRate;
-	const std::uint64_t number = hasOwnRate ? FrameNumber(fields, inRow.mCount)
-											: CallersRateFrameNumber(fields, rate, inRow.mKind == DisplayKind::Frames);
+	const std::uint64_t number = inRow.HasOwnRate()
+		? FrameNumber(fields, inRow.mCount)
+		: CallersRateFrameNumber(fields, rate, inRow.mKind == DisplayKind::Frames);
 	const TickTime time(zoncore::utility::WrappingMultiply(static_cast<std::int64_t>(number), rate.GetTicksPerFrame()));
-	return inNegative ? -time : time;
+	return inFields.mNegative ? -time : time;
 }
 
 }   // namespace zonmediatypes

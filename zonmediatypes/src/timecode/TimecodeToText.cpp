@@ -27,52 +27,68 @@ constexpr char FrameSeparator(const TimeDisplayRow& inRow)
 	return inRow.mKind == DisplayKind::Milliseconds ? '.' : ':';
 }
 
+// Frame labels or samples in a second, as far as they are shown in a field.
+constexpr std::uint64_t NominalCount(const TimeDisplayRow& inRow, FrameRate inRate)
+{
+	if (inRow.mKind != DisplayKind::Samples)
+		return inRow.mCount.mNominal;
+	const std::int64_t duration = inRate.GetTicksPerFrame();
+	return duration < 1 ? 0 : static_cast<std::uint64_t>(kTicksPerSecond / duration);
+}
+
 // How many digits the frames field has at least: those of the largest frame number, up to five and with some room for
 // rates that are just above a power of ten.
-std::size_t FrameDigits(const TimeDisplayRow& inRow, FrameRate inRate)
+constexpr std::size_t FrameDigits(std::uint64_t inNominal)
 {
-	if (inRow.mKind == DisplayKind::Timecode)
-		return 2;
-	const std::int64_t duration = (inRow.CountsAtCallersRate() ? inRate : inRow.mRate).GetTicksPerFrame();
-	const std::int64_t nominal = duration < 1 ? 0 : kTicksPerSecond / duration;
-	if (nominal < 11 || nominal > 109'999)
+	if (inNominal < 11 || inNominal > 109'999)
 		return 1;
-	return nominal <= 109 ? 2 : nominal <= 1'099 ? 3 : nominal <= 10'999 ? 4 : 5;
+	return inNominal <= 109 ? 2 : inNominal <= 1'099 ? 3 : inNominal <= 10'999 ? 4 : 5;
 }
+
+// Whether every frame number has exactly two digits.
+constexpr bool HasTwoFrameDigits(std::uint64_t inNominal)
+{
+	return inNominal > 10 && inNominal <= 100;
+}
+static_assert(!HasTwoFrameDigits(10) && !HasTwoFrameDigits(101) && FrameDigits(10) == 1 && FrameDigits(120) == 3);
 
 // What the texts of one rate, display and set of flags have in common.
 class TextForm
 {
 public:
 	TextForm(FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
-		: mDisplay(ChooseDisplay(inDisplay, inRate)),
-		  mRow(FindTimeDisplay(mDisplay)),
+		: mPlace(PlaceOf(ChooseDisplay(inDisplay, inRate))),
+		  mRow(kTimeDisplayTable[mPlace]),
 		  mRate(inRate),
 		  mFlags(inFlags),
-		  mFrameDigits(FrameDigits(mRow, inRate))
+		  mNominal(NominalCount(mRow, inRate))
 	{
 	}
 
-	bool IsUsual() const
+	bool IsFullForm() const
 	{
 		constexpr TimecodeFlags kOtherForms
 			= kTimecodeFlag_OmitHours | kTimecodeFlag_TrimLeadingZeros | kTimecodeFlag_ShowSign;
-		return mRow.mKind == DisplayKind::Timecode && (mFlags & kOtherForms) == TimecodeFlags();
+		return mRow.mKind == DisplayKind::Timecode && HasTwoFrameDigits(mNominal)
+			&& (mFlags & kOtherForms) == TimecodeFlags();
 	}
 
-	// The display whose fields are shown: feet are made of frames.
-	TimeDisplay GetFieldDisplay() const { return mRow.mKind == DisplayKind::Film ? kTimeDisplay_Frames : mDisplay; }
+	// Of the display whose fields are shown: feet are made of frames.
+	std::size_t GetFieldPlace() const
+	{
+		return mRow.mKind == DisplayKind::Film ? PlaceOf(kTimeDisplay_Frames) : mPlace;
+	}
 
 	TickTime ShownTime(TickTime inTime) const
 	{
 		return mFlags.Test(kTimecodeFlag_LastFrame) ? MovedByFrames(inTime, -1, mRate) : inTime;
 	}
 
-	// Writes kUsualLength characters; inFields are those of inShown.
+	// Writes kFullFormLength characters; inFields are those of inShown.
 	template <class Char>
-	void WriteUsual(Char* outText, TickTime inShown, HMSF inFields) const
+	void WriteFullForm(Char* outText, TickTime inShown, TimecodeFields inFields) const
 	{
-		const HMSF fields = ShownFields(inShown, inFields);
+		const TimecodeFields fields = ShownFields(inShown, inFields);
 		WriteTwoDigits(fields.mHours, outText);
 		outText[2] = Char{':'};
 		WriteTwoDigits(fields.mMinutes, outText + 3);
@@ -83,27 +99,27 @@ public:
 	}
 
 	// Puts any form.
-	void Put(TimecodeWriter& ioText, TickTime inShown, HMSF inFields) const;
+	void Put(TimecodeWriter& ioText, TickTime inShown, TimecodeFields inFields) const;
 
 private:
 	// Of a negative time without a sign the hours run backwards.
-	HMSF ShownFields(TickTime inShown, HMSF inFields) const
+	TimecodeFields ShownFields(TickTime inShown, TimecodeFields inFields) const
 	{
 		if (inShown < kTime_Zero && !mFlags.Test(kTimecodeFlag_ShowSign))
 			inFields.mHours = 23 - inFields.mHours;
 		return inFields;
 	}
 
-	void PutFields(TimecodeWriter& ioText, HMSF inFields) const;
+	void PutFields(TimecodeWriter& ioText, TimecodeFields inFields) const;
 
-	TimeDisplay mDisplay;
+	std::size_t mPlace;
 	const TimeDisplayRow& mRow;
 	FrameRate mRate;
 	TimecodeFlags mFlags;
-	std::size_t mFrameDigits;
+	std::uint64_t mNominal;
 };
 
-void TextForm::PutFields(TimecodeWriter& ioText, HMSF inFields) const
+void TextForm::PutFields(TimecodeWriter& ioText, TimecodeFields inFields) const
 {
 	bool isLeading = mFlags.Test(kTimecodeFlag_TrimLeadingZeros);
 	const auto put = [&](std::uint32_t inField)
@@ -125,7 +141,7 @@ void TextForm::PutFields(TimecodeWriter& ioText, HMSF inFields) const
 	putBeforeColon(inFields.mMinutes);
 	put(inFields.mSeconds);
 	ioText.Put(FrameSeparator(mRow));
-	ioText.PutNumber(inFields.mFrames, mFrameDigits);
+	ioText.PutNumber(inFields.mFrames, FrameDigits(mNominal));
 }
 
 void PutFeet(TimecodeWriter& ioText, std::int64_t inFrames, int inFramesPerFoot)
@@ -135,7 +151,7 @@ void PutFeet(TimecodeWriter& ioText, std::int64_t inFrames, int inFramesPerFoot)
 	ioText.PutTwoDigits(Magnitude(inFrames % inFramesPerFoot));
 }
 
-void TextForm::Put(TimecodeWriter& ioText, TickTime inShown, HMSF inFields) const
+void TextForm::Put(TimecodeWriter& ioText, TickTime inShown, TimecodeFields inFields) const
 {
 	const bool showsSign = mFlags.Test(kTimecodeFlag_ShowSign);
 	const auto count = static_cast<std::int64_t>(inFields.mFrames);
@@ -161,31 +177,31 @@ struct ShownTimecode
 	ShownTimecode(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
 		: mForm(inRate, inDisplay, inFlags),
 		  mTime(mForm.ShownTime(inTime)),
-		  mFields(FieldsOf(mTime, inRate, mForm.GetFieldDisplay()))
+		  mFields(FieldsOf(mTime, inRate, mForm.GetFieldPlace()))
 	{
 	}
 
 	template <class Char>
-	void WriteUsual(Char* outText) const
+	void WriteFullForm(Char* outText) const
 	{
-		mForm.WriteUsual(outText, mTime, mFields);
+		mForm.WriteFullForm(outText, mTime, mFields);
 	}
 
 	void Put(TimecodeWriter& ioText) const { mForm.Put(ioText, mTime, mFields); }
 
 	TextForm mForm;
 	TickTime mTime;
-	HMSF mFields;
+	TimecodeFields mFields;
 };
 
 template <class Char>
 std::size_t WriteTimecode(std::span<Char> outText, const ShownTimecode& inShown)
 {
-	if (inShown.mForm.IsUsual())
+	if (inShown.mForm.IsFullForm())
 	{
-		if (outText.size() >= kUsualLength)
-			inShown.WriteUsual(outText.data());
-		return kUsualLength;
+		if (outText.size() >= kFullFormLength)
+			inShown.WriteFullForm(outText.data());
+		return kFullFormLength;
 	}
 	TimecodeWriter text;
 	inShown.Put(text);
@@ -197,10 +213,10 @@ std::size_t WriteTimecode(std::span<Char> outText, const ShownTimecode& inShown)
 UTF16String TimeToTimecode(TickTime inTime, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
 {
 	const ShownTimecode shown(inTime, inRate, inDisplay, inFlags);
-	if (shown.mForm.IsUsual())
+	if (shown.mForm.IsFullForm())
 	{
-		UTF16String text(kUsualLength, UTF16Char{});
-		shown.WriteUsual(text.data());
+		UTF16String text(kFullFormLength, UTF16Char{});
+		shown.WriteFullForm(text.data());
 		return text;
 	}
 	TimecodeWriter text;
@@ -225,19 +241,19 @@ std::size_t TimesToTimecode(std::span<TimecodeText> outTexts, std::span<const Ti
 {
 	const std::size_t count = std::min(outTexts.size(), inTimes.size());
 	const TextForm form(inRate, inDisplay, inFlags);
-	const bool isUsual = form.IsUsual();
-	WithSplitter<zoncore::utility::Reciprocal>(inRate, form.GetFieldDisplay(),
-		[&](auto inSplit)
+	const bool isFullForm = form.IsFullForm();
+	WithSplitter<zoncore::utility::Reciprocal>(inRate, form.GetFieldPlace(),
+		[=](auto inSplit)
 		{
 			for (std::size_t i = 0; i < count; ++i)
 			{
 				const TickTime time = form.ShownTime(inTimes[i]);
-				const HMSF fields = inSplit(time);
+				const TimecodeFields fields = inSplit(time);
 				TimecodeText& text = outTexts[i];
-				if (isUsual)
+				if (isFullForm)
 				{
-					form.WriteUsual(text.mCharacters.data(), time, fields);
-					text.mLength = kUsualLength;
+					form.WriteFullForm(text.mCharacters.data(), time, fields);
+					text.mLength = kFullFormLength;
 					continue;
 				}
 				TimecodeWriter writer;
