@@ -73,6 +73,7 @@ TEST(PixelAspectRatio, ComparesWithToleranceAndZeros)
 	EXPECT_EQ(Ratio(1'000, 1'001), Ratio(999, 1'000));
 	EXPECT_EQ(Ratio(0, 0), kPixelAspectRatio_Any);
 	EXPECT_GT(Ratio(0, 0), Ratio(1'000, 1));
+	EXPECT_FALSE(Ratio(0, 0) < Ratio(1, 0)) << "other ratios, and equal as numbers";
 }
 
 // ---- Text ------------------------------------------------------------------------------------------------------------
