@@ -3,6 +3,7 @@
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <initializer_list>
 #include <limits>
 #include <string>
 #include <string_view>
@@ -35,52 +36,64 @@ constexpr BeatInfo kCompound{480, 90, 6, 8, 0};
 constexpr BeatInfo kDecimal{-1, 120, 4, 4, 0};
 constexpr BeatInfo kWithOffset{960, 120, 4, 4, 1'500};
 
+struct WrittenCase
+{
+	double mSamples;
+	BeatInfo mBeats;
+	bool mIsDuration;
+	int mStyle;
+	const char* mText;
+};
+
+void ExpectWritten(std::initializer_list<WrittenCase> inCases)
+{
+	for (const auto& [samples, beats, isDuration, style, expected] : inCases)
+		EXPECT_EQ(Write(samples, beats, isDuration, style), expected) << samples << " in style " << style;
+}
+
 TEST(BarsAndBeats, AreWritten)
 {
-	struct Case
-	{
-		double mSamples;
-		BeatInfo mBeats;
-		bool mIsDuration;
-		int mStyle;
-		const char* mText;
-	};
-	for (const auto& [samples, beats, isDuration, style, expected] : std::initializer_list<Case>{
-			 // Styles
-			 {132'000, kCommonTime, false, -1, ""},
-			 {132'000, kCommonTime, false, 0, "2"},
-			 {132'000, kCommonTime, false, 1, "2:2"},
-			 {132'000, kCommonTime, false, 2, "2:2.480"},
-			 {132'000, kCommonTime, false, 99, "2:2.480.000"},
-			 {1, kCommonTime, false, 3, "1:1.000.040"},   // 0.04 ticks
-			 {132'000, kCommonTime, true, 2, "1:1.480"},
-			 // Ticks have as many digits as the largest one
-			 {72'000, {-2, 120, 4, 4, 0}, true, 3, "0:2.0.000"},
-			 {132'000, {1, 120, 4, 4, 0}, false, 3, "2:2.0.500"},
-			 {72'000, {10, 120, 4, 4, 1'500}, false, 2, "1:1.0"},
-			 {72'000, {11, 120, 4, 4, 1'500}, false, 2, "1:1.00"},
-			 {72'000, {101, 120, 4, 4, 1'500}, false, 2, "1:1.000"},
-			 {72'000, {1'001, 120, 4, 4, 1'500}, false, 2, "1:1.0000"},
-			 // Before the first bar
-			 {48'000, kWithOffset, false, 2, "0:4.000"},
-			 {-96'000, kCommonTime, false, 1, "0:1"},
-			 {-96'001, kCommonTime, false, 1, "-1:4"},
-			 {12'000, {960, 120, -4, 4, 0}, false, 1, "1:1"},
-			 {-12'000, {960, 120, -4, 4, 0}, false, 1, "1:1"},
-			 // Eighths at 180 a minute
-			 {80'000, kCompound, false, 2, "1:6.000"},
-			 {96'000, kCompound, false, 2, "2:1.000"},
-			 // Decimal beats: the nudge of -0.0005 beats lies in the bar before
-			 {0, kDecimal, false, 2, "04.000"},
-			 {30'000, kDecimal, false, 0, "12.000"},
-			 {30'000, kDecimal, false, 3, "12.000.000"},
-			 {36'012, kDecimal, false, 2, "12.0"},
-			 {24'012, kDecimal, false, 2, "12"},   // nothing behind a point that is not there
-			 // No position at all
-			 {72'000, {0, 120, 4, 4, 1'500}, true, 0, "-2305843009213693952"},   // the nudge divides by it
-			 {kInfinity, kCommonTime, true, 1, "-2305843009213693952:0"},
-		 })
-		EXPECT_EQ(Write(samples, beats, isDuration, style), expected) << samples << " in style " << style;
+	ExpectWritten({
+		// Styles
+		{132'000, kCommonTime, false, -1, ""},
+		{132'000, kCommonTime, false, 0, "2"},
+		{132'000, kCommonTime, false, 1, "2:2"},
+		{132'000, kCommonTime, false, 2, "2:2.480"},
+		{132'000, kCommonTime, false, 99, "2:2.480.000"},
+		{1, kCommonTime, false, 3, "1:1.000.040"},   // 0.04 ticks
+		{132'000, kCommonTime, true, 2, "1:1.480"},
+		// Ticks have as many digits as the largest one
+		{72'000, {-2, 120, 4, 4, 0}, true, 3, "0:2.0.000"},
+		{132'000, {1, 120, 4, 4, 0}, false, 3, "2:2.0.500"},
+		{72'000, {10, 120, 4, 4, 1'500}, false, 2, "1:1.0"},
+		{72'000, {11, 120, 4, 4, 1'500}, false, 2, "1:1.00"},
+		{72'000, {101, 120, 4, 4, 1'500}, false, 2, "1:1.000"},
+		{72'000, {1'001, 120, 4, 4, 1'500}, false, 2, "1:1.0000"},
+		// Before the first bar
+		{48'000, kWithOffset, false, 2, "0:4.000"},
+		{-96'000, kCommonTime, false, 1, "0:1"},
+		{-96'001, kCommonTime, false, 1, "-1:4"},
+		{12'000, {960, 120, -4, 4, 0}, false, 1, "1:1"},
+		{-12'000, {960, 120, -4, 4, 0}, false, 1, "1:1"},
+		// Eighths at 180 a minute
+		{80'000, kCompound, false, 2, "1:6.000"},
+		{96'000, kCompound, false, 2, "2:1.000"},
+	});
+}
+
+TEST(BarsAndBeats, AreWrittenWhereTheTextMeansLittle)
+{
+	ExpectWritten({
+		// Decimal beats: the nudge of -0.0005 beats lies in the bar before
+		{0, kDecimal, false, 2, "04.000"},
+		{30'000, kDecimal, false, 0, "12.000"},
+		{30'000, kDecimal, false, 3, "12.000.000"},
+		{36'012, kDecimal, false, 2, "12.0"},
+		{24'012, kDecimal, false, 2, "12"},   // nothing behind a point that is not there
+		// No position at all
+		{72'000, {0, 120, 4, 4, 1'500}, true, 0, "-2305843009213693952"},   // the nudge divides by it
+		{kInfinity, kCommonTime, true, 1, "-2305843009213693952:0"},
+	});
 }
 
 TEST(BarsAndBeats, AreRead)
@@ -96,6 +109,7 @@ TEST(BarsAndBeats, AreRead)
 	for (const auto& [text, beats, isDuration, expected] : std::initializer_list<Case>{
 			 {"2:2.480", kCommonTime, false, 132'000},
 			 {"1:1.480", kCommonTime, true, 132'000},
+			 {"0:4", kCommonTime, false, -23'999},
 			 {"3", kCommonTime, false, 192'000},
 			 {"3", kWithOffset, false, 264'000},
 			 {"3", kWithOffset, true, 288'000},

@@ -10,97 +10,99 @@ namespace zonmediatypes
 namespace
 {
 
+constexpr FrameRate kCallers(123);
+constexpr auto kDefault = static_cast<TimeDisplay>(55);
+
+// What is true of a display.
+enum : unsigned
+{
+	kAudio = 1,
+	kDrop = 2,
+	kEither = 4,   // drop-frame numbering is applicable
+	kFields = 8,
+	kFieldsOfFrames = 16   // where a host shows frames as fields
+};
+
+struct DisplayCase
+{
+	TimeDisplay mDisplay;
+	FrameRate mRate;
+	unsigned mIs = kFields;
+};
+
+constexpr DisplayCase sDisplays[] = {
+	{kTimeDisplay_24Timecode, kFrameRate_Film24},
+	{kTimeDisplay_25Timecode, kFrameRate_VideoPAL},
+	{kTimeDisplay_2997DropTimecode, kFrameRate_VideoNTSC, kDrop | kEither | kFields},
+	{kTimeDisplay_2997NonDropTimecode, kFrameRate_VideoNTSC, kEither | kFields},
+	{kTimeDisplay_30Timecode, kFrameRate_Video30},
+	{kTimeDisplay_50Timecode, kFrameRate_VideoPAL_HD},
+	{kTimeDisplay_5994DropTimecode, kFrameRate_VideoNTSC_HD, kDrop | kEither | kFields},
+	{kTimeDisplay_5994NonDropTimecode, kFrameRate_VideoNTSC_HD, kEither | kFields},
+	{kTimeDisplay_60Timecode, kFrameRate_Video60},
+	{kTimeDisplay_Frames, kCallers, kFieldsOfFrames},
+	{kTimeDisplay_23976Timecode, kFrameRate_23976},
+	{kTimeDisplay_16mmFeetFrames, kCallers, 0},
+	{kTimeDisplay_35mmFeetFrames, kCallers, 0},
+	{kTimeDisplay_48Timecode, kFrameRate_Film48},
+	{kTimeDisplay_AudioSamples, kCallers, kAudio | kFields},
+	{kTimeDisplay_Milliseconds, kFrameRate_Video1000, kAudio | kFields},
+	{kTimeDisplay_Auto, kFrameRate_Zero, 0},
+	// No displays
+	{static_cast<TimeDisplay>(202), kFrameRate_Zero},
+	{static_cast<TimeDisplay>(std::numeric_limits<int>::max()), kFrameRate_Zero},
+	{static_cast<TimeDisplay>(std::numeric_limits<int>::min()), kFrameRate_Zero},
+};
+
+// Hosts store them.
+static_assert(kTimeDisplay_24Timecode == 100 && kTimeDisplay_48Timecode == 113 && kTimeDisplay_AudioSamples == 200
+	&& kTimeDisplay_Milliseconds == 201 && kTimeDisplay_Auto == 999);
+
 TEST(TimeDisplay, IsListedAndClassified)
 {
-	constexpr FrameRate kCallers(123);
-	const struct
-	{
-		int mDisplay;
-		FrameRate mRate;
-		bool mIsAudio, mIsDrop, mIsDropApplicable, mIsHMSF, mIsHMSFWithFrames;
-	} displays[] = {
-		{100, kFrameRate_Film24, false, false, false, true, true},
-		{101, kFrameRate_VideoPAL, false, false, false, true, true},
-		{102, kFrameRate_VideoNTSC, false, true, true, true, true},
-		{103, kFrameRate_VideoNTSC, false, false, true, true, true},
-		{104, kFrameRate_Video30, false, false, false, true, true},
-		{105, kFrameRate_VideoPAL_HD, false, false, false, true, true},
-		{106, kFrameRate_VideoNTSC_HD, false, true, true, true, true},
-		{107, kFrameRate_VideoNTSC_HD, false, false, true, true, true},
-		{108, kFrameRate_Video60, false, false, false, true, true},
-		{109, kCallers, false, false, false, false, true},
-		{110, kFrameRate_23976, false, false, false, true, true},
-		{111, kCallers, false, false, false, false, false},
-		{112, kCallers, false, false, false, false, false},
-		{113, kFrameRate_Film48, false, false, false, true, true},
-		{200, kCallers, true, false, false, true, true},
-		{201, kFrameRate_Video1000, true, false, false, true, true},
-		{999, kFrameRate_Zero, false, false, false, false, false},
-		{202, kFrameRate_Zero, false, false, false, true, true},
-		{std::numeric_limits<int>::max(), kFrameRate_Zero, false, false, false, true, true},
-		{std::numeric_limits<int>::min(), kFrameRate_Zero, false, false, false, true, true},
-	};
 	const auto all = AllTimeDisplays();
 	ASSERT_EQ(all.size(), 17u);
-	std::size_t place = 0;
-	for (const auto& [number, rate, isAudio, isDrop, isDropApplicable, isHMSF, isHMSFWithFrames] : displays)
+	for (std::size_t place = 0; place < std::size(sDisplays); ++place)
 	{
-		SCOPED_TRACE(number);
-		const auto display = static_cast<TimeDisplay>(number);
+		const auto& [display, rate, is] = sDisplays[place];
+		SCOPED_TRACE(display);
 		EXPECT_TRUE(place >= all.size() || all[place] == display);
-		++place;
+		EXPECT_TRUE(place > 13 || display == kTimeDisplay_24Timecode + static_cast<int>(place));
 		EXPECT_EQ(GetFrameRateForTimeDisplay(display, kCallers), rate);
-		EXPECT_EQ(IsTimeDisplayFormatAudio(display), isAudio);
-		EXPECT_EQ(IsTimeDisplayDropFrame(display), isDrop);
-		EXPECT_EQ(IsDropFrameApplicableForTimeDisplay(display), isDropApplicable);
-		EXPECT_EQ(IsHMSFTimeDisplay(display, false), isHMSF);
-		EXPECT_EQ(IsHMSFTimeDisplay(display, true), isHMSFWithFrames);
+		EXPECT_EQ(IsTimeDisplayFormatAudio(display), (is & kAudio) != 0);
+		EXPECT_EQ(IsTimeDisplayDropFrame(display), (is & kDrop) != 0);
+		EXPECT_EQ(IsDropFrameApplicableForTimeDisplay(display), (is & kEither) != 0);
+		EXPECT_EQ(IsHMSFTimeDisplay(display, false), (is & kFields) != 0);
+		EXPECT_EQ(IsHMSFTimeDisplay(display, true), (is & (kFields | kFieldsOfFrames)) != 0);
 	}
+}
+
+TimeDisplay Choose(FrameRate inRate, bool inDropFrame, bool inAllowMilliseconds = false)
+{
+	const auto get = [=](bool inUnused)
+	{ return GetTimeDisplayForFrameRate(inRate, inDropFrame, inUnused, kDefault, inAllowMilliseconds); };
+	EXPECT_EQ(get(false), get(true));
+	return get(false);
 }
 
 TEST(TimeDisplay, IsChosenForARate)
 {
-	constexpr int kDefault = 55;
-	const struct
+	for (const auto& [display, rate, is] : sDisplays)
 	{
-		FrameRate mRate;
-		int mDropFrame, mNonDrop, mMilliseconds;
-	} choices[] = {
-		{kFrameRate_23976, 110, 110, 110},
-		{kFrameRate_Film24, 100, 100, 100},
-		{kFrameRate_VideoPAL, 101, 101, 101},
-		{kFrameRate_VideoNTSC, 102, 103, 103},
-		{kFrameRate_Video30, 104, 104, 104},
-		{kFrameRate_Film48, 113, 113, 113},
-		{kFrameRate_VideoPAL_HD, 105, 105, 105},
-		{kFrameRate_VideoNTSC_HD, 106, 107, 107},
-		{kFrameRate_Video60, 108, 108, 108},
-		{kFrameRate_Video1000, kDefault, kDefault, 201},
-	};
-	const auto choose = [](FrameRate inRate, bool inDropFrame, bool inAllowMilliseconds)
-	{
-		const auto get = [=](bool inUnused)
-		{
-			return GetTimeDisplayForFrameRate(
-				inRate, inDropFrame, inUnused, static_cast<TimeDisplay>(kDefault), inAllowMilliseconds);
-		};
-		EXPECT_EQ(get(false), get(true));
-		return static_cast<int>(get(false));
-	};
-	for (const auto& [rate, dropFrame, nonDrop, milliseconds] : choices)
-	{
-		SCOPED_TRACE(rate);
-		EXPECT_EQ(choose(rate, true, false), dropFrame);
-		EXPECT_EQ(choose(rate, false, false), nonDrop);
-		EXPECT_EQ(choose(rate, false, true), milliseconds);
+		const bool isTimecode = (is & (kAudio | kFields)) == kFields && rate != kFrameRate_Zero;
+		for (const bool isDrop : {false, true})
+			EXPECT_EQ(
+				Choose(rate, isDrop) == display, isTimecode && ((is & kEither) == 0 || isDrop == ((is & kDrop) != 0)))
+				<< display;
 	}
+	EXPECT_EQ(Choose(kFrameRate_Video1000, true, true), kTimeDisplay_Milliseconds);
 	for (const FrameRate rate : {kFrameRate_Audio22050, kFrameRate_Audio32000, kFrameRate_Audio44100,
 			 kFrameRate_Audio48000, kFrameRate_Audio88200, kFrameRate_Audio96000, kFrameRate_Audio192000})
-		EXPECT_EQ(choose(rate, true, true), kTimeDisplay_AudioSamples) << rate;
+		EXPECT_EQ(Choose(rate, true, true), kTimeDisplay_AudioSamples) << rate;
 	for (const FrameRate rate : {kFrameRate_Audio8000, kFrameRate_Audio11025, kFrameRate_Video10, kFrameRate_Video12,
-			 kFrameRate_Video12_5, kFrameRate_Video15, kFrameRate_Video100, kFrameRate_Zero, FrameRate(0),
-			 FrameRate(-1), kFrameRate_Film24 / 1.001})
-		EXPECT_EQ(choose(rate, true, true), kDefault) << rate;
+			 kFrameRate_Video12_5, kFrameRate_Video15, kFrameRate_Video100, kFrameRate_Video1000, kFrameRate_Zero,
+			 FrameRate(0), FrameRate(-1), FrameRate(5'292'001), kFrameRate_Film24 / 1.001})
+		EXPECT_EQ(Choose(rate, true), kDefault) << rate;
 }
 
 }   // namespace

@@ -11,7 +11,6 @@
 #include <initializer_list>
 #include <limits>
 #include <span>
-#include <string>
 #include <vector>
 
 namespace zonmediatypes
@@ -62,59 +61,52 @@ void ExpectInBuffer(
 	ASSERT_EQ(std::ranges::count(buffer, kUntouched), std::ssize(buffer) - std::ssize(inText));
 }
 
-class EveryDisplay : public testing::TestWithParam<TimeDisplay>
-{
-};
-
-TEST_P(EveryDisplay, FillsBuffersAndColumnsWithTheTextOfOneTime)
+void ExpectTextsOfOneTime(FrameRate inRate, TimeDisplay inDisplay, unsigned inFlags)
 {
 	const std::vector<TickTime> times = Times();
-	for (const FrameRate rate : Rates())
-		for (unsigned flags = 0; flags < 16; ++flags)
-		{
-			std::vector<TimecodeText> texts(times.size());
-			std::vector<UTF16StringView> views;
-			std::vector<TickTime> read(times.size());
-			ASSERT_EQ(TimesToTimecode(texts, times, rate, GetParam(), flags), times.size());
-			for (std::size_t i = 0; i < times.size(); ++i)
-			{
-				const UTF16String text = TimeToTimecode(times[i], rate, GetParam(), flags);
-				ExpectInBuffer<UTF16Char>(text, times[i], rate, GetParam(), flags);
-				ExpectInBuffer<char>(text, times[i], rate, GetParam(), flags);
-				views.push_back(texts[i].GetText());
-				ASSERT_EQ(views[i], text) << times[i].GetTicks() << " at " << rate.GetTicksPerFrame();
-			}
-			ASSERT_EQ(TimecodesToTimes(read, views, rate, GetParam(), flags), times.size());
-			for (std::size_t i = 0; i < times.size(); ++i)
-				ASSERT_EQ(read[i], TimecodeToTime(views[i], rate, GetParam(), flags));
-		}
+	std::vector<TimecodeText> texts(times.size());
+	std::vector<UTF16StringView> views;
+	std::vector<TickTime> read(times.size());
+	ASSERT_EQ(TimesToTimecode(texts, times, inRate, inDisplay, inFlags), times.size());
+	for (std::size_t i = 0; i < times.size(); ++i)
+	{
+		const UTF16String text = TimeToTimecode(times[i], inRate, inDisplay, inFlags);
+		ExpectInBuffer<UTF16Char>(text, times[i], inRate, inDisplay, inFlags);
+		ExpectInBuffer<char>(text, times[i], inRate, inDisplay, inFlags);
+		views.push_back(texts[i].GetText());
+		ASSERT_EQ(views[i], text) << times[i].GetTicks() << " at " << inRate.GetTicksPerFrame();
+	}
+	ASSERT_EQ(TimecodesToTimes(read, views, inRate, inDisplay, inFlags), times.size());
+	for (std::size_t i = 0; i < times.size(); ++i)
+		ASSERT_EQ(read[i], TimecodeToTime(views[i], inRate, inDisplay, inFlags));
 }
 
-TEST_P(EveryDisplay, FillsColumnsWithTheFieldsOfOneTime)
+void ExpectFieldsOfOneTime(FrameRate inRate, TimeDisplay inDisplay)
 {
 	const std::vector<TickTime> times = Times();
-	for (const FrameRate rate : Rates())
+	std::vector<TimecodeFields> column(times.size(), {1, 2, 3, true, 4});
+	ASSERT_EQ(TimesToHMSF(column, times, inRate, inDisplay), times.size());
+	for (std::size_t i = 0; i < times.size(); ++i)
 	{
-		std::vector<TimecodeFields> column(times.size(), {1, 2, 3, true, 4});
-		ASSERT_EQ(TimesToHMSF(column, times, rate, GetParam()), times.size());
-		for (std::size_t i = 0; i < times.size(); ++i)
-		{
-			TimecodeFields one;
-			TimeToHMSF(one.mHours, one.mMinutes, one.mSeconds, one.mFrames, one.mNegative, times[i], rate, GetParam());
-			ASSERT_EQ(column[i], one) << times[i].GetTicks() << " at " << rate.GetTicksPerFrame();
-		}
+		TimecodeFields one;
+		TimeToHMSF(one.mHours, one.mMinutes, one.mSeconds, one.mFrames, one.mNegative, times[i], inRate, inDisplay);
+		ASSERT_EQ(column[i], one) << times[i].GetTicks() << " at " << inRate.GetTicksPerFrame();
 	}
 }
 
-std::vector<TimeDisplay> Displays()
+TEST(TimecodeBuffersAndColumns, HoldWhatOneTimeGives)
 {
 	std::vector<TimeDisplay> displays(AllTimeDisplays().begin(), AllTimeDisplays().end());
 	displays.push_back(static_cast<TimeDisplay>(0));
-	return displays;
+	for (const TimeDisplay display : displays)
+		for (const FrameRate rate : Rates())
+		{
+			SCOPED_TRACE(display);
+			ExpectFieldsOfOneTime(rate, display);
+			for (unsigned flags = 0; flags < 16; ++flags)
+				ExpectTextsOfOneTime(rate, display, flags);
+		}
 }
-
-INSTANTIATE_TEST_SUITE_P(Timecode, EveryDisplay, testing::ValuesIn(Displays()),
-	[](const auto& inInfo) { return std::to_string(inInfo.param); });
 
 TEST(TimecodeColumns, EndWithTheShorterSpanAndAllocateNothing)
 {
