@@ -10,6 +10,7 @@
 #include "zonmediatypes/Descriptions.h"
 
 #include <array>
+#include <boost/rational.hpp>
 #include <clocale>
 #include <cstddef>
 #include <cstdio>

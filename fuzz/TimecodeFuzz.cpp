@@ -3,6 +3,7 @@
 #include "BufferChecks.h"
 #include "Numbers.h"
 #include "RateInput.h"
+#include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <algorithm>

@@ -5,6 +5,7 @@
 #include "tests/PixelFormatTable.h"
 #include "tests/WithTranslator.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 #include "zonmediatypes/FrameRate.h"
 
 #include "zoncore/StringUtils.h"
-#include "zoncore/UTF16String.h"
+#include "zoncore/UTF16Stream.h"
 
 #include <gtest/gtest.h>
 

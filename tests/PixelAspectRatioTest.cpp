@@ -2,8 +2,10 @@
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/PixelAspectRatioUtils.h"
 
+#include <boost/rational.hpp>
 #include <gtest/gtest.h>
 
 #include <boost/lexical_cast.hpp>

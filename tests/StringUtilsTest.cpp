@@ -1,6 +1,7 @@
 #include "zoncore/StringUtils.h"
 
 #include "tests/Walks.h"
+#include "zoncore/UTF16Stream.h"
 
 #include <gtest/gtest.h>
 

@@ -3,7 +3,7 @@
 #include "zoncore/Debug.h"
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
-#include "zoncore/UTF16String.h"
+#include "zoncore/UTF16Stream.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

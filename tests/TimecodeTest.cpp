@@ -2,6 +2,7 @@
 
 #include "tests/Walks.h"
 #include "zoncore/StringUtils.h"
+#include "zonmediatypes/TimeUtils.h"
 
 #include <gtest/gtest.h>
 

@@ -4,6 +4,7 @@
 #include "zoncore/Localizer.h"
 #include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/Descriptions.h"
 
 #include <algorithm>

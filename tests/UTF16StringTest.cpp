@@ -1,4 +1,4 @@
-#include "zoncore/UTF16String.h"
+#include "zoncore/UTF16Stream.h"
 
 #include "tests/HostileLocale.h"
 #include "zoncore/StringUtils.h"

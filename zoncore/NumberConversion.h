@@ -5,30 +5,26 @@
 
 #include "zoncore/Export.h"
 #include "zoncore/Flags.h"
+#include "zoncore/TruncateTo.h"
 #include "zoncore/UTF16String.h"
 
 #include <array>
-#include <boost/rational.hpp>
 #include <charconv>
 #include <concepts>
 #include <cstddef>
-#include <cstdint>
 #include <limits>
+#include <string_view>
+
+namespace boost
+{
+
+template <typename IntType>
+class rational;
+
+}   // namespace boost
 
 namespace zoncore::utility
 {
-
-/// inValue truncated toward zero; the most negative value of Integer for NaN and for everything that does not fit, the
-/// infinities included.
-template <class Integer>
-	requires std::same_as<Integer, std::int64_t> || std::same_as<Integer, std::int32_t>
-constexpr Integer TruncateTo(double inValue) noexcept
-{
-	constexpr double kTooLarge = -static_cast<double>(std::numeric_limits<Integer>::min());   // 2^63 or 2^31
-	constexpr double kTooSmall = sizeof(Integer) == 8 ? -kTooLarge * (1 + 0x1p-52) : -kTooLarge - 1;
-	return inValue > kTooSmall && inValue < kTooLarge ? static_cast<Integer>(inValue)
-													  : std::numeric_limits<Integer>::min();
-}
 
 /// Drops the trailing zeros of a fraction, and then a bare point.
 inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
@@ -41,6 +37,13 @@ inline constexpr unsigned short kNumberFlag_DropTrailingZeros = 4;
 /// Counts of any size are legal: text that no memory holds is longer than inMaxLength. The result is what is allocated.
 ZONCORE_API UTF16String NumberToString(double inValue, std::size_t inMinIntegerDigits, std::size_t inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength);
+
+/// Room for what WriteGeneral writes.
+using GeneralText = std::array<char, 16>;
+
+/// inValue as printf's "%g" and a stream write it by default: six significant digits without trailing zeros, with an exponent
+/// where that is shorter ("1.5", "0.333333", "1.79769e+308", "inf"). The text lies in outText.
+ZONCORE_API std::string_view WriteGeneral(double inValue, GeneralText& outText) noexcept;
 
 /// inValue in decimal digits, with "-" before a negative one.
 template <std::integral Integer>
@@ -69,7 +72,8 @@ bool StringToNumber(const UTF16String& inText, Number& outValue, unsigned inOpti
 
 /// The fraction closest to inValue with both terms in -2147483646..2147483646; of two equally close ones that with the
 /// smaller denominator, then the one nearer to zero. NaN gives 0/1; a larger magnitude gives plus or minus 2147483646/1.
-/// The closest fraction to a rounded quotient need not be the quotient's own. Costs some dozens of divisions at most.
+/// The closest fraction to a rounded quotient need not be the quotient's own. Costs some dozens of divisions at most. Using
+/// it takes <boost/rational.hpp>.
 ///
 /// Compare a boost::rational with a boost::rational only: with a bare integer the comparison never returns in C++20 with
 /// the supported compilers and Boost.

@@ -1,68 +1,20 @@
 #pragma once
 
 /// \file
-/// Memory for the many small, short-lived blocks of texts and tables: pooled, so that a block is served and taken back
-/// in a few nanoseconds. 16-bit texts, channel layouts and lists of formats take theirs here.
+/// The small-block allocator with all its containers: the vector, which texts and tables use everywhere, and the map.
 
-#include "zoncore/Export.h"
+#include "zoncore/SmallBlocks.h"
 
-#include <cstddef>
-#include <functional>
-#include <limits>
 #include <map>
-#include <new>
 #include <utility>
-#include <vector>
 
-namespace zoncore::utility
+namespace zoncore::utility::detail
 {
 
-/// Serves blocks of up to 256 bytes from pools and larger ones from `operator new`. Any thread may allocate and dispose;
-/// a block may be disposed of on another thread than it was allocated on, after that thread has ended, and during static
-/// destruction. Pools only grow: what is disposed of is kept for the next block of its size.
-class ZONCORE_API SmallBlockAllocator
+template <class Key, class Value>
+struct SmallBlockMap
 {
-public:
-	/// A block of at least inSize bytes, aligned for any scalar type. inSize 0 gives a block that must be disposed of,
-	/// too. Throws std::bad_alloc when memory runs out.
-	[[nodiscard]] static void* Allocate(std::size_t inSize);
-
-	/// Takes back a block that Allocate(inSize) gave; a null pointer is ignored.
-	static void Dispose(void* inBlock, std::size_t inSize) noexcept;
-
-	/// The standard allocator over Allocate and Dispose. All instances are equal.
-	template <class T>
-	class Allocator
-	{
-	public:
-		using value_type = T;
-
-		constexpr Allocator() noexcept = default;
-		template <class Other>
-		constexpr Allocator(const Allocator<Other>&) noexcept   // NOLINT(google-explicit-constructor): rebinding
-		{
-		}
-
-		[[nodiscard]] T* allocate(std::size_t inCount)
-		{
-			static_assert(alignof(T) <= alignof(std::max_align_t), "over-aligned types need an allocator of their own");
-			if (inCount > std::numeric_limits<std::size_t>::max() / sizeof(T))
-				throw std::bad_array_new_length();
-			return static_cast<T*>(Allocate(inCount * sizeof(T)));
-		}
-		void deallocate(T* inBlock, std::size_t inCount) noexcept { Dispose(inBlock, inCount * sizeof(T)); }
-
-		template <class Other>
-		friend constexpr bool operator==(const Allocator&, const Allocator<Other>&) noexcept
-		{
-			return true;
-		}
-	};
-
-	template <class T>
-	using vector = std::vector<T, Allocator<T>>;
-	template <class Key, class Value>
-	using map = std::map<Key, Value, std::less<Key>, Allocator<std::pair<const Key, Value>>>;
+	using Type = std::map<Key, Value, std::less<Key>, SmallBlockAllocator::Allocator<std::pair<const Key, Value>>>;
 };
 
-}   // namespace zoncore::utility
+}   // namespace zoncore::utility::detail

@@ -44,12 +44,13 @@ inline std::string UTF16to8(const UTF16Char* inText)
 ZONCORE_API void ReplaceInString(UTF16String& ioText, const UTF16String& inWhat, const UTF16String& inWith);
 
 /// The value as a fresh 16-bit stream writes it: numbers as with std::ostream and the classic locale (doubles with six
-/// significant digits), a UTF16Char as its number. Costs a stream; where speed matters, write digits directly.
-template <class T>
+/// significant digits), a UTF16Char as its number. Costs a stream; where speed matters, write digits directly. Using it takes
+/// UTF16Stream.h.
+template <class T, class Stream = oUTF16StringStream>
 UTF16String Coercion(const T& inValue)
 {
-	oUTF16StringStream stream;
-	stream.exceptions(std::ios_base::badbit);   // memory that runs out is reported, not a text cut short
+	Stream stream;
+	stream.exceptions(Stream::badbit);   // memory that runs out is reported, not a text cut short
 	stream << inValue;
 	return stream.str();
 }

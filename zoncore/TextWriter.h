@@ -1,17 +1,19 @@
 #pragma once
 
+/// \file
+/// Text under construction in a fixed buffer: what a stream would write, without a stream and without memory.
+
+#include "zoncore/NumberConversion.h"
 #include "zoncore/UTF16String.h"
 
-#include <algorithm>
 #include <array>
 #include <charconv>
 #include <concepts>
 #include <cstddef>
-#include <iterator>
 #include <span>
 #include <string_view>
 
-namespace zonmediatypes
+namespace zoncore::utility
 {
 
 inline constexpr std::size_t kLongestInteger = 20;   // characters of a 64-bit integer, its sign included
@@ -27,16 +29,18 @@ Char* WriteTwoDigits(std::size_t inNumber, Char* outText) noexcept
 			pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
 		return pairs;
 	}();
-	return std::copy_n(kPairs[inNumber].data(), 2, outText);
+	outText[0] = kPairs[inNumber][0];
+	outText[1] = kPairs[inNumber][1];
+	return outText + 2;
 }
 
 /// Copies an ASCII text into a caller's buffer if it fits, and leaves the buffer alone if not; the length of the text.
 template <class Char>
-std::size_t CopyText(zoncore::UTF16StringView inAscii, std::span<Char> outText) noexcept
+std::size_t CopyText(UTF16StringView inAscii, std::span<Char> outText) noexcept
 {
 	if (inAscii.size() <= outText.size())
-		std::ranges::transform(
-			inAscii, outText.begin(), [](zoncore::UTF16Char inChar) { return static_cast<Char>(inChar); });
+		for (std::size_t i = 0; i < inAscii.size(); ++i)
+			outText[i] = static_cast<Char>(inAscii[i]);
 	return inAscii.size();
 }
 
@@ -51,7 +55,11 @@ public:
 	TextWriter& operator=(const TextWriter&) = delete;
 
 	void Put(char inChar) noexcept { *mEnd++ = static_cast<unsigned char>(inChar); }
-	void Put(std::string_view inAscii) noexcept { mEnd = std::ranges::copy(inAscii, mEnd).out; }
+	void Put(std::string_view inAscii) noexcept
+	{
+		for (const char character : inAscii)
+			Put(character);
+	}
 
 	/// inNumber is below 100.
 	void PutTwoDigits(std::size_t inNumber) noexcept { mEnd = WriteTwoDigits(inNumber, mEnd); }
@@ -63,27 +71,26 @@ public:
 		if (inNumber >= 0 && inNumber < 100 && inWidth == 2)
 			return PutTwoDigits(static_cast<std::size_t>(inNumber));
 		char digits[kLongestInteger]{};   // a compiler that does not see what to_chars writes warns otherwise
-		const char* const end = std::to_chars(digits, std::end(digits), inNumber).ptr;
+		const char* const end = std::to_chars(digits, digits + kLongestInteger, inNumber).ptr;
 		const auto length = static_cast<std::size_t>(end - digits);
 		for (std::size_t i = length; i < inWidth; ++i)
 			Put('0');
 		Put(std::string_view(digits, length));
 	}
 
-	/// inNumber as a stream writes it by default: six significant digits, with an exponent where that is shorter.
+	/// inNumber as a stream writes it by default; see WriteGeneral.
 	void PutNumber(double inNumber) noexcept
 	{
-		char digits[kLongestInteger];   // 12 at most
-		const char* const end = std::to_chars(digits, std::end(digits), inNumber, std::chars_format::general, 6).ptr;
-		Put(std::string_view(digits, static_cast<std::size_t>(end - digits)));
+		GeneralText text;
+		Put(WriteGeneral(inNumber, text));
 	}
 
-	std::span<zoncore::UTF16Char> GetChars() noexcept { return {mChars.data(), mEnd}; }
-	zoncore::UTF16StringView GetText() const noexcept { return {mChars.data(), mEnd}; }
+	std::span<UTF16Char> GetChars() noexcept { return {mChars.data(), mEnd}; }
+	UTF16StringView GetText() const noexcept { return {mChars.data(), mEnd}; }
 
 private:
-	std::array<zoncore::UTF16Char, inCapacity> mChars;
-	zoncore::UTF16Char* mEnd = mChars.data();
+	std::array<UTF16Char, inCapacity> mChars;
+	UTF16Char* mEnd = mChars.data();
 };
 
-}   // namespace zonmediatypes
+}   // namespace zoncore::utility

@@ -7,7 +7,7 @@
 ///     ComputeChannelConversionMatrix(CreateBroadcast51ChannelLayout(), CreateStereoChannelLayout(), matrix);
 ///     // L takes L and R takes R; centre, LFE and surrounds are routed nowhere
 
-#include "zoncore/SmallBlockAllocator.h"
+#include "zoncore/SmallBlocks.h"
 #include "zonmediatypes/AudioChannelLabel.h"
 #include "zonmediatypes/Export.h"
 

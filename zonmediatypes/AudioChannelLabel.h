@@ -11,7 +11,7 @@
 ///     HasChannelLabel(layout, kAudioChannelLabel_FrontCenter);   // false
 ///     LeftRightPair(kAudioChannelLabel_BackLeft);                // kAudioChannelLabel_BackRight
 
-#include "zoncore/SmallBlockAllocator.h"
+#include "zoncore/SmallBlocks.h"
 #include "zonmediatypes/Export.h"
 
 #include <compare>

@@ -9,7 +9,8 @@
 ///     kFrameRate_VideoNTSC * 2;      // kFrameRate_VideoNTSC_HD
 ///     kFrameRate_VideoPAL_HD / 2;    // kFrameRate_VideoPAL
 
-#include "zoncore/NumberConversion.h"
+#include "zoncore/TruncateTo.h"
+#include "zoncore/UTF16Char.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Export.h"
 
@@ -159,8 +160,7 @@ struct FewerFramesPerSecond
 /// "29.97", "23.976"; kFrameRate_Zero is "0", a duration of 0 "inf". The text is padded as any text; the other settings of
 /// the stream have no effect.
 ZONMEDIATYPES_API std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, FrameRate inRate);
-ZONMEDIATYPES_API std::basic_ostream<unsigned short>& operator<<(
-	std::basic_ostream<unsigned short>& inStream, FrameRate inRate);
+ZONMEDIATYPES_API zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, FrameRate inRate);
 ZONMEDIATYPES_API std::basic_ostream<unsigned char>& operator<<(
 	std::basic_ostream<unsigned char>& inStream, FrameRate inRate);
 

@@ -17,8 +17,8 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/Export.h"
 
+#include <iosfwd>
 #include <limits>
-#include <ostream>
 #include <span>
 
 namespace zonmediatypes
@@ -72,8 +72,8 @@ constexpr bool operator>=(PixelAspectRatio inLHS, PixelAspectRatio inRHS) noexce
 /// The ratio as a number with four decimals ("0.9091"), with one for ratios within 0.001 of 1, 1.5 and 2 ("1.0");
 /// "1.79769e+308" for a denominator of 0. Written as the stream's own text inserter does, width and fill included.
 ZONMEDIATYPES_API std::ostream& operator<<(std::ostream& ioStream, const PixelAspectRatio& inRatio);
-ZONMEDIATYPES_API std::basic_ostream<zoncore::UTF16Char>& operator<<(
-	std::basic_ostream<zoncore::UTF16Char>& ioStream, const PixelAspectRatio& inRatio);
+ZONMEDIATYPES_API zoncore::UTF16OutputStream& operator<<(
+	zoncore::UTF16OutputStream& ioStream, const PixelAspectRatio& inRatio);
 
 // ---- Constants -------------------------------------------------------------------------------------------------------
 

@@ -19,7 +19,7 @@
 #include "zonmediatypes/PixelFormatProperties.h"
 
 #include <cstdint>
-#include <ostream>
+#include <iosfwd>
 
 namespace zonmediatypes
 {
@@ -142,8 +142,8 @@ struct PixelFormat
 /// Writes PixelFormatDescription (Descriptions.h) as the stream's own text inserter does, width and fill included; the
 /// `char` stream receives UTF-8 up to the first zero.
 ZONMEDIATYPES_API std::ostream& operator<<(std::ostream& ioStream, const PixelFormat& inFormat);
-ZONMEDIATYPES_API std::basic_ostream<zoncore::UTF16Char>& operator<<(
-	std::basic_ostream<zoncore::UTF16Char>& ioStream, const PixelFormat& inFormat);
+ZONMEDIATYPES_API zoncore::UTF16OutputStream& operator<<(
+	zoncore::UTF16OutputStream& ioStream, const PixelFormat& inFormat);
 
 // ---- Constants -------------------------------------------------------------------------------------------------------
 //

@@ -13,7 +13,7 @@
 /// Lists may be empty, may repeat formats, and may hold invalid, custom and wildcard ones; the registry of custom formats
 /// is not asked.
 
-#include "zoncore/SmallBlockAllocator.h"
+#include "zoncore/SmallBlocks.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/PixelFormat.h"
 

@@ -12,8 +12,9 @@
 ///
 /// Arithmetic wraps on overflow and reports nothing; only division by zero is reported.
 
-#include "zoncore/NumberConversion.h"
 #include "zoncore/SourcePlace.h"
+#include "zoncore/TruncateTo.h"
+#include "zoncore/UTF16Char.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
@@ -152,8 +153,7 @@ inline constexpr TickTime kTime_Invalid(-400'000 * kTicksPerSecond);   ///< no t
 /// Writes the time in seconds. On a `char` stream it is inserted as any double is. On a 16-bit stream it has six
 /// significant digits ("1.5", "0.333333", "360000") whatever the settings of the stream are, and is padded as any text.
 ZONMEDIATYPES_API std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, const TickTime& inTime);
-ZONMEDIATYPES_API std::basic_ostream<unsigned short>& operator<<(
-	std::basic_ostream<unsigned short>& inStream, const TickTime& inTime);
+ZONMEDIATYPES_API zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, const TickTime& inTime);
 
 // ---- Inline implementation: frames -----------------------------------------------------------------------------------
 

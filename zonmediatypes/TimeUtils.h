@@ -12,18 +12,13 @@
 
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/RatioTime.h"
 #include "zonmediatypes/TickTime.h"
 
 #include <boost/rational.hpp>
 
 namespace zonmediatypes
 {
-
-/// Seconds as a fraction in lowest terms with a positive denominator.
-using RatioTime = boost::rational<long long>;
-
-/// The same in 32-bit terms, as older hosts store it.
-using LegacyRatioTime = boost::rational<int>;
 
 /// Exact.
 ZONMEDIATYPES_API RatioTime TimeToRatioTime(TickTime inTime);

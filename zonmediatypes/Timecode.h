@@ -15,9 +15,9 @@
 #include "zoncore/UTF16String.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
+#include "zonmediatypes/RatioTime.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/TimeDisplayUtils.h"
-#include "zonmediatypes/TimeUtils.h"
 
 #include <array>
 #include <cstddef>
@@ -151,15 +151,12 @@ inline TickTime TimecodeToTime(
 	return TimecodeToTime(zoncore::UTF16StringView(inText), inRate, inDisplay, inFlags);
 }
 
-/// TimecodeToTime as a fraction of seconds; rejected text is kTime_Invalid, -400000/1.
+/// TimecodeToTime as a fraction of seconds; rejected text is kTime_Invalid, -400000/1. Exact times are defined in
+/// TimeUtils.h.
 ZONMEDIATYPES_API RatioTime TimecodeToRatioTime(
 	zoncore::UTF16StringView inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags = {});
-
-inline RatioTime TimecodeToRatioTime(
-	const zoncore::UTF16String& inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags = {})
-{
-	return TimecodeToRatioTime(zoncore::UTF16StringView(inText), inRate, inDisplay, inFlags);
-}
+ZONMEDIATYPES_API RatioTime TimecodeToRatioTime(
+	const zoncore::UTF16String& inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags = {});
 
 /// TimeToTimecode of the nearest tick.
 ZONMEDIATYPES_API zoncore::UTF16String RatioTimeToTimecode(

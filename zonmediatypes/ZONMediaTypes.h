@@ -6,6 +6,8 @@
 /// zoncore and zonmediatypes both have a namespace `utility`: with `using namespace` for both, write zoncore::utility and
 /// zonmediatypes::utility in full.
 
+#include "zoncore/SmallBlockAllocator.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/AudioChannelMap.h"
 #include "zonmediatypes/AudioFormat.h"
@@ -21,6 +23,7 @@
 #include "zonmediatypes/PixelFormatSize.h"
 #include "zonmediatypes/PixelFormatUtils.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"
+#include "zonmediatypes/RatioTime.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/TimeBase.h"
 #include "zonmediatypes/TimeConversionUtils.h"

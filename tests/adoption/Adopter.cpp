@@ -1,6 +1,7 @@
 #include "zoncore/CheckRegistry.h"
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/TickTime.h"
 #include "zonmediatypes/Version.h"

@@ -1,11 +1,14 @@
 #include "zoncore/NumberConversion.h"
 
 #include "zoncore/StringUtils.h"
+#include "zoncore/TextScanner.h"
 #include "zoncore/WideInteger.h"
+#include "zoncore/WrappingArithmetic.h"
 #include "zoncore/src/System.h"
 
 #include <algorithm>
 #include <array>
+#include <boost/rational.hpp>
 #include <charconv>
 #include <cmath>
 #include <cstddef>
@@ -24,15 +27,6 @@ namespace
 constexpr std::size_t kMostIntegerDigits = 309;   // of a finite double
 constexpr std::size_t kMostDecimals = 1'074;      // beyond these every double has zeros only
 constexpr std::size_t kLongestFixedText = kMostIntegerDigits + 1 + kMostDecimals;
-constexpr int kGeneralDigits = 6;   // the precision of "%g"
-
-UTF16String GeneralText(double inValue)
-{
-	std::array<char, 32> buffer;
-	const auto result = std::to_chars(
-		buffer.data(), buffer.data() + buffer.size(), inValue, std::chars_format::general, kGeneralDigits);
-	return AsciiToUTF16({buffer.data(), result.ptr});
-}
 
 // The digits of inMagnitude, rounded; no more decimals than a double can have.
 std::string_view FixedText(double inMagnitude, std::size_t inDecimals, std::span<char, kLongestFixedText> outBuffer)
@@ -53,63 +47,22 @@ std::string_view WithoutTrailingZeros(std::string_view inText)
 
 // ---- Text to numbers -------------------------------------------------------------------------------------------------
 
-constexpr bool IsWhiteSpace(UTF16Char inChar)
+template <class Integer>
+bool ReadInteger(UTF16StringView inText, Integer& outValue)
 {
-	return inChar == ' ' || (inChar >= '\t' && inChar <= '\r');
-}
-
-constexpr bool IsDigit(UTF16Char inChar)
-{
-	return inChar >= '0' && inChar <= '9';
+	TextScanner scanner(inText);
+	scanner.SkipWhiteSpace();
+	const bool isNegative = scanner.TakeSign() == Sign::Minus;
+	const DigitRun digits = scanner.TakeDigits(Magnitude(std::numeric_limits<Integer>::max()) + (isNegative ? 1 : 0));
+	const bool isNumber = digits.mCount != 0 && !digits.mIsTooLarge;
+	const std::uint64_t magnitude = isNumber ? digits.mValue : 0;
+	outValue = static_cast<Integer>(isNegative ? 0 - magnitude : magnitude);
+	return isNumber;
 }
 
 std::size_t CountDigits(UTF16StringView inText)
 {
 	return static_cast<std::size_t>(std::ranges::find_if_not(inText, IsDigit) - inText.begin());
-}
-
-// Takes a sign off the front of ioText; true for "-".
-bool TakeSign(UTF16StringView& ioText)
-{
-	if (ioText.empty() || (ioText.front() != '-' && ioText.front() != '+'))
-		return false;
-	const bool isNegative = ioText.front() == '-';
-	ioText.remove_prefix(1);
-	return isNegative;
-}
-
-// The sign and the characters of the number that inText begins with, white space and "+" taken off.
-struct NumberText
-{
-	bool mIsNegative;
-	UTF16StringView mText;
-};
-
-NumberText SkipToNumber(UTF16StringView inText)
-{
-	inText.remove_prefix(static_cast<std::size_t>(std::ranges::find_if_not(inText, IsWhiteSpace) - inText.begin()));
-	const bool isNegative = TakeSign(inText);
-	return {isNegative, inText};
-}
-
-template <class Integer>
-bool ReadInteger(UTF16StringView inText, Integer& outValue)
-{
-	outValue = 0;
-	const NumberText number = SkipToNumber(inText);
-	const std::size_t digits = CountDigits(number.mText);
-	const std::uint64_t largest
-		= static_cast<std::uint64_t>(std::numeric_limits<Integer>::max()) + (number.mIsNegative ? 1 : 0);
-	std::uint64_t magnitude = 0;
-	for (const UTF16Char digit : number.mText.substr(0, digits))
-	{
-		const std::uint64_t value = digit - std::uint64_t{'0'};
-		if (magnitude > (largest - value) / 10)
-			return false;
-		magnitude = magnitude * 10 + value;
-	}
-	outValue = static_cast<Integer>(number.mIsNegative ? 0 - magnitude : magnitude);
-	return digits != 0;
 }
 
 // How much of inText is a decimal number without sign: digits, a point and an exponent that has digits. 0 for none.
@@ -126,20 +79,18 @@ std::size_t DecimalLength(UTF16StringView inText)
 	}
 	if (length == 0 || length == inText.size() || (inText[length] | 0x20) != 'e')
 		return length;
-	UTF16StringView exponent = inText.substr(length + 1);
-	TakeSign(exponent);
-	const std::size_t digits = CountDigits(exponent);
-	return digits == 0 ? length : inText.size() - exponent.size() + digits;
+	TextScanner exponent(inText.substr(length + 1));
+	exponent.TakeSign();
+	return exponent.TakeDigits(0).mCount == 0 ? length : length + 1 + exponent.GetPosition();
 }
 
 // The number behind an exponent's mark; one that is far beyond every text's length and every double is cut short.
 std::int64_t ReadExponent(UTF16StringView inText)
 {
-	constexpr std::int64_t kMost = 4'000'000'000'000'000'000;
-	const bool isNegative = TakeSign(inText);
-	std::int64_t magnitude = 0;
-	for (const UTF16Char digit : inText)
-		magnitude = std::min(kMost, std::min(magnitude, kMost / 10) * 10 + (digit - '0'));
+	constexpr std::uint64_t kMost = 4'000'000'000'000'000'000;
+	TextScanner scanner(inText);
+	const bool isNegative = scanner.TakeSign() == Sign::Minus;
+	const auto magnitude = static_cast<std::int64_t>(scanner.TakeDigits(kMost).mValue);
 	return isNegative ? -magnitude : magnitude;
 }
 
@@ -284,6 +235,14 @@ Fraction ClosestFraction(const Target& inTarget)
 
 }   // namespace
 
+std::string_view WriteGeneral(double inValue, GeneralText& outText) noexcept
+{
+	constexpr int kSignificantDigits = 6;
+	const auto result = std::to_chars(
+		outText.data(), outText.data() + outText.size(), inValue, std::chars_format::general, kSignificantDigits);
+	return {outText.data(), result.ptr};
+}
+
 UTF16String NumberToString(double inValue, std::size_t inMinIntegerDigits, std::size_t inDecimals,
 	Flags<unsigned short> inFlags, int inMaxLength)
 {
@@ -305,7 +264,10 @@ UTF16String NumberToString(double inValue, std::size_t inMinIntegerDigits, std::
 	const std::size_t maxLength = inMaxLength < 0 ? 0 : static_cast<std::size_t>(inMaxLength);
 	const std::size_t length = digits.size() + (isNegative ? 1 : 0);
 	if (length > maxLength || moreDecimals > maxLength - length || moreDigits > maxLength - length - moreDecimals)
-		return GeneralText(inValue);
+	{
+		GeneralText text;
+		return AsciiToUTF16(WriteGeneral(inValue, text));
+	}
 
 	UTF16String text(length + moreDecimals + moreDigits, '0');
 	if (isNegative)
@@ -327,12 +289,15 @@ bool StringToNumber(UTF16StringView inText, long long& outValue, unsigned /*inOp
 bool StringToNumber(UTF16StringView inText, double& outValue, unsigned /*inOptions*/)
 {
 	outValue = 0;
-	const NumberText number = SkipToNumber(inText);
-	const std::size_t length = DecimalLength(number.mText);
+	TextScanner scanner(inText);
+	scanner.SkipWhiteSpace();
+	const bool isNegative = scanner.TakeSign() == Sign::Minus;
+	const UTF16StringView number = inText.substr(scanner.GetPosition());
+	const std::size_t length = DecimalLength(number);
 	if (length == 0)
 		return false;
-	const double magnitude = ReadDecimal(number.mText.substr(0, length));
-	outValue = number.mIsNegative ? -magnitude : magnitude;
+	const double magnitude = ReadDecimal(number.substr(0, length));
+	outValue = isNegative ? -magnitude : magnitude;
 	return true;
 }
 

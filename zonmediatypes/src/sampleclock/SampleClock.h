@@ -1,8 +1,8 @@
 #pragma once
 
 #include "zoncore/SourcePlace.h"
+#include "zoncore/TextWriter.h"
 #include "zonmediatypes/TimeConversionUtils.h"
-#include "zonmediatypes/src/TextWriter.h"
 
 #include <cmath>
 #include <cstddef>
@@ -13,9 +13,9 @@
 namespace zonmediatypes::utility
 {
 
-using PositionText = TextWriter<kLongestPosition>;
-static_assert(
-	kLongestPosition >= 4 * kLongestInteger + 3);   // bar, beat, ticks and thousandths, with what separates them
+using PositionText = zoncore::utility::TextWriter<kLongestPosition>;
+static_assert(kLongestPosition
+	>= 4 * zoncore::utility::kLongestInteger + 3);   // bar, beat, ticks and thousandths, with what separates them
 
 /// Digits of the largest number below inCount, as far as positions are padded: 1 to 4.
 constexpr std::size_t PaddedDigits(std::int32_t inCount) noexcept
@@ -63,7 +63,7 @@ template <class Char, class Put, class... Arguments>
 std::size_t WriteText(std::span<Char> outText, Put inPut, const Arguments&... inArguments)
 {
 	PositionText text;
-	return PutText(text, inPut, inArguments...) ? CopyText(text.GetText(), outText) : 0;
+	return PutText(text, inPut, inArguments...) ? zoncore::utility::CopyText(text.GetText(), outText) : 0;
 }
 
 /// The part of inValue after the point, with its sign; exact.

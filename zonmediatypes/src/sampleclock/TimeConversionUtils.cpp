@@ -1,8 +1,8 @@
 #include "zonmediatypes/TimeConversionUtils.h"
 
 #include "zoncore/NumberConversion.h"
+#include "zoncore/TextScanner.h"
 #include "zoncore/WrappingArithmetic.h"
-#include "zonmediatypes/src/Digits.h"
 #include "zonmediatypes/src/sampleclock/SampleClock.h"
 #include "zonmediatypes/src/time/DropFrame.h"
 
@@ -18,6 +18,7 @@ namespace
 using zoncore::UTF16Char;
 using zoncore::UTF16String;
 using zoncore::UTF16StringView;
+using zoncore::utility::IsDigit;
 using zoncore::utility::Magnitude;
 using zoncore::utility::TruncateTo;
 using zoncore::utility::WrappingAdd;

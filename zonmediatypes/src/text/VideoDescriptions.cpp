@@ -3,6 +3,7 @@
 #include "zoncore/Localizer.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/src/text/TextKeys.h"
 #include "zonmediatypes/src/text/VideoTextKeys.h"
 
@@ -14,7 +15,6 @@
 namespace zonmediatypes
 {
 
-using zoncore::UTF16Char;
 using zoncore::UTF16String;
 using zoncore::ZString;
 using zoncore::config::Localizer;
@@ -133,7 +133,7 @@ std::ostream& operator<<(std::ostream& ioStream, const PixelFormat& inFormat)
 	return ioStream << UTF16to8(PixelFormatDescription(inFormat)).c_str();   // up to the first zero byte
 }
 
-std::basic_ostream<UTF16Char>& operator<<(std::basic_ostream<UTF16Char>& ioStream, const PixelFormat& inFormat)
+zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& ioStream, const PixelFormat& inFormat)
 {
 	return ioStream << PixelFormatDescription(inFormat);
 }

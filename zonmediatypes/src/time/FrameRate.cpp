@@ -1,7 +1,8 @@
 #include "zonmediatypes/FrameRate.h"
 
+#include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
-#include "zoncore/UTF16String.h"
+#include "zoncore/UTF16Stream.h"
 #include "zonmediatypes/src/time/RateText.h"
 
 #include <algorithm>
@@ -62,7 +63,7 @@ std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, FrameRa
 	return inStream << zoncore::utility::UTF16to8(RateText(inRate));
 }
 
-std::basic_ostream<unsigned short>& operator<<(std::basic_ostream<unsigned short>& inStream, FrameRate inRate)
+zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, FrameRate inRate)
 {
 	return inStream << RateText(inRate);
 }

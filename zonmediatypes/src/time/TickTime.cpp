@@ -2,11 +2,9 @@
 
 #include "zoncore/Debug.h"
 #include "zoncore/Error.h"
+#include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
-#include "zoncore/UTF16String.h"
-
-#include <charconv>
-#include <string_view>
+#include "zoncore/UTF16Stream.h"
 
 namespace zonmediatypes
 {
@@ -34,13 +32,10 @@ std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, const T
 	return inStream << Seconds(inTime);
 }
 
-std::basic_ostream<unsigned short>& operator<<(std::basic_ostream<unsigned short>& inStream, const TickTime& inTime)
+zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, const TickTime& inTime)
 {
-	constexpr int kSignificantDigits = 6;
-	char buffer[32];
-	const auto result
-		= std::to_chars(buffer, std::end(buffer), Seconds(inTime), std::chars_format::general, kSignificantDigits);
-	return inStream << zoncore::utility::AsciiToUTF16(std::string_view(buffer, result.ptr));
+	zoncore::utility::GeneralText text;
+	return inStream << zoncore::utility::AsciiToUTF16(zoncore::utility::WriteGeneral(Seconds(inTime), text));
 }
 
 }   // namespace zonmediatypes

@@ -1,7 +1,8 @@
 #include "zonmediatypes/Timecode.h"
 
+#include "zoncore/TextScanner.h"
 #include "zoncore/WrappingArithmetic.h"
-#include "zonmediatypes/src/Digits.h"
+#include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/src/timecode/TimecodeFields.h"
 
 #include <algorithm>
@@ -16,19 +17,12 @@ namespace
 
 using zoncore::UTF16Char;
 using zoncore::UTF16StringView;
+using zoncore::utility::IsDigit;
+using zoncore::utility::IsSign;
+using zoncore::utility::IsWhiteSpace;
 using zoncore::utility::WrappingAdd;
 using zoncore::utility::WrappingMultiply;
 using zoncore::utility::WrappingNegate;
-
-constexpr bool IsWhiteSpace(UTF16Char inChar)
-{
-	return inChar == ' ' || (inChar >= '\t' && inChar <= '\r');
-}
-
-constexpr bool IsSign(UTF16Char inChar)
-{
-	return inChar == '+' || inChar == '-';
-}
 
 constexpr bool IsSeparator(UTF16Char inChar)
 {
@@ -193,6 +187,12 @@ std::size_t TimecodesToTimes(std::span<TickTime> outTimes, std::span<const UTF16
 RatioTime TimecodeToRatioTime(UTF16StringView inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
 {
 	return TimeToRatioTime(TimecodeToTime(inText, inRate, inDisplay, inFlags));
+}
+
+RatioTime TimecodeToRatioTime(
+	const zoncore::UTF16String& inText, FrameRate inRate, TimeDisplay inDisplay, TimecodeFlags inFlags)
+{
+	return TimecodeToRatioTime(UTF16StringView(inText), inRate, inDisplay, inFlags);
 }
 
 }   // namespace zonmediatypes

@@ -1,6 +1,7 @@
 #include "zonmediatypes/Timecode.h"
 
-#include "zonmediatypes/src/TextWriter.h"
+#include "zoncore/TextWriter.h"
+#include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/src/timecode/TimecodeFields.h"
 
 #include <algorithm>
@@ -15,9 +16,12 @@ namespace
 
 using zoncore::UTF16Char;
 using zoncore::UTF16String;
+using zoncore::utility::CopyText;
+using zoncore::utility::kLongestInteger;
 using zoncore::utility::Magnitude;
+using zoncore::utility::WriteTwoDigits;
 
-using TimecodeWriter = TextWriter<kLongestTimecode>;
+using TimecodeWriter = zoncore::utility::TextWriter<kLongestTimecode>;
 static_assert(kLongestTimecode >= std::string_view("-23:59:59:").size() + kLongestInteger);
 
 constexpr char FrameSeparator(const TimeDisplayRow& inRow)

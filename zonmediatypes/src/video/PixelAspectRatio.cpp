@@ -2,6 +2,7 @@
 
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
+#include "zoncore/UTF16Stream.h"
 
 #include <array>
 #include <cstddef>
@@ -66,7 +67,7 @@ std::ostream& operator<<(std::ostream& ioStream, const PixelAspectRatio& inRatio
 	return ioStream << zoncore::utility::UTF16to8(RatioText(inRatio));
 }
 
-std::basic_ostream<UTF16Char>& operator<<(std::basic_ostream<UTF16Char>& ioStream, const PixelAspectRatio& inRatio)
+zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& ioStream, const PixelAspectRatio& inRatio)
 {
 	return ioStream << RatioText(inRatio);
 }

@@ -4,6 +4,7 @@
 #include "zoncore/WrappingArithmetic.h"
 
 #include <array>
+#include <boost/rational.hpp>
 #include <cstdint>
 #include <numeric>
 

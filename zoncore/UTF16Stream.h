@@ -1,0 +1,121 @@
+#pragma once
+
+/// \file
+/// Streams over 16-bit text.
+///
+///     oUTF16StringStream stream;
+///     stream << std::setw(4) << std::setfill(UTF16Char('0')) << 12 << " " << 29.97 << " fps";
+///     stream.str();   // "0012 29.97 fps"
+///
+/// The streams format and read integers, doubles and Booleans as a `char` stream with the classic locale does, width, fill
+/// and precision included, whatever the global locale is. Text is written as UTF16String, as UTF16Char*, as a narrow literal
+/// (" fps"), or character by character with put(). A single code unit is a number to `<<` and `>>`, and so is a narrow
+/// character: `stream << UTF16Char(65)` and `stream << 'A'` write "65". A stream is for one thread at a time, as standard
+/// streams are.
+///
+/// The standard library has no character facets for 16-bit characters; they are declared here and live in this library,
+/// so that a stream made on one side of a shared library's boundary works on the other.
+
+#include "zoncore/Export.h"
+#include "zoncore/UTF16String.h"
+
+#include <cstddef>
+#include <ios>
+#include <istream>
+#include <locale>
+#include <ostream>
+#include <sstream>
+#include <streambuf>
+#include <string>
+#include <utility>
+
+/// Classification and case of ASCII; every code unit above 7F is of no class and its own upper and lower case.
+template <>
+class ZONCORE_API std::ctype<zoncore::UTF16Char> : public std::__ctype_abstract_base<zoncore::UTF16Char>
+{
+public:
+	using char_type = zoncore::UTF16Char;
+
+	static std::locale::id id;
+
+	explicit ctype(std::size_t inReferences = 0) : std::__ctype_abstract_base<char_type>(inReferences) {}
+
+protected:
+	~ctype() override = default;
+
+	bool do_is(mask inMask, char_type inChar) const override;
+	const char_type* do_is(const char_type* inBegin, const char_type* inEnd, mask* outMasks) const override;
+	const char_type* do_scan_is(mask inMask, const char_type* inBegin, const char_type* inEnd) const override;
+	const char_type* do_scan_not(mask inMask, const char_type* inBegin, const char_type* inEnd) const override;
+	char_type do_toupper(char_type inChar) const override;
+	const char_type* do_toupper(char_type* ioBegin, const char_type* inEnd) const override;
+	char_type do_tolower(char_type inChar) const override;
+	const char_type* do_tolower(char_type* ioBegin, const char_type* inEnd) const override;
+	char_type do_widen(char inChar) const override;
+	const char* do_widen(const char* inBegin, const char* inEnd, char_type* outChars) const override;
+	char do_narrow(char_type inChar, char inDefault) const override;
+	const char_type* do_narrow(
+		const char_type* inBegin, const char_type* inEnd, char inDefault, char* outChars) const override;
+};
+
+/// The classic punctuation of numbers: "." as decimal point and no grouping.
+template <>
+class ZONCORE_API std::numpunct<zoncore::UTF16Char> : public std::locale::facet
+{
+public:
+	using char_type = zoncore::UTF16Char;
+	using string_type = std::basic_string<char_type>;
+
+	static std::locale::id id;
+
+	explicit numpunct(std::size_t inReferences = 0) : std::locale::facet(inReferences) {}
+
+	char_type decimal_point() const { return do_decimal_point(); }
+	char_type thousands_sep() const { return do_thousands_sep(); }
+	std::string grouping() const { return do_grouping(); }
+	string_type truename() const { return do_truename(); }
+	string_type falsename() const { return do_falsename(); }
+
+protected:
+	~numpunct() override = default;
+
+	virtual char_type do_decimal_point() const;
+	virtual char_type do_thousands_sep() const;
+	virtual std::string do_grouping() const;
+	virtual string_type do_truename() const;
+	virtual string_type do_falsename() const;
+};
+
+extern template class ZONCORE_API std::num_get<zoncore::UTF16Char>;
+extern template class ZONCORE_API std::num_put<zoncore::UTF16Char>;
+
+namespace zoncore
+{
+
+/// The classic locale with the facets that 16-bit streams need. The streams below have it from construction on; a 16-bit
+/// stream of another kind is given it with imbue().
+ZONCORE_API const std::locale& ClassicUTF16Locale();
+
+/// A standard string stream with the classic facets for 16-bit characters; it moves and swaps as the standard one does.
+template <class Stream>
+class ClassicUTF16Stream : public Stream
+{
+public:
+	ClassicUTF16Stream() { Imbue(); }
+	explicit ClassicUTF16Stream(std::ios_base::openmode inMode) : Stream(inMode) { Imbue(); }
+	explicit ClassicUTF16Stream(const UTF16String& inText) : Stream(inText) { Imbue(); }
+	ClassicUTF16Stream(const UTF16String& inText, std::ios_base::openmode inMode) : Stream(inText, inMode) { Imbue(); }
+
+	// Written out: the virtual base of streams does not move by itself, the standard streams move what it holds.
+	ClassicUTF16Stream(ClassicUTF16Stream&& ioOther) noexcept : Stream(std::move(ioOther)) {}
+	ClassicUTF16Stream& operator=(ClassicUTF16Stream&& ioOther) noexcept
+	{
+		Stream::operator=(std::move(ioOther));
+		return *this;
+	}
+
+private:
+	void Imbue() { this->imbue(ClassicUTF16Locale()); }
+};
+
+}   // namespace zoncore
