@@ -65,7 +65,7 @@ inline constexpr int kPixelConversionCost_Impossible = 10'000;
 
 /// What it costs to convert frames: kPixelConversionCost_Impossible from and to what is not concrete or of unknown
 /// compression, even if it is equal; 0 for other equal properties; impossible into a compressed format; else the points of
-/// every change added up, as the \ref pixel_format_guide "guide" lists them. Losses cost more at high quality.
+/// every change added up, as the \ref video_guide "guide" lists them. Losses cost more at high quality.
 ZONMEDIATYPES_API int PixelConversionCost(
 	const PixelFormatProperties& inFrom, const PixelFormatProperties& inTo, RenderQuality inQuality) noexcept;
 
