@@ -24,19 +24,19 @@ struct DVFrame
 	std::int32_t mHeight;
 	std::int32_t mBytes;
 	PixelAspectRatio mShape;
-	PixelAspectRatio mWideShape = mShape;
+	PixelAspectRatio mOtherShape;   // the same one where there is one only
 };
 
 // clang-format off
 constexpr auto sDVFrames = std::to_array<DVFrame>({
-	{kPixelFormatCompression_NTSCDV25,        720,  480, 120'000, kPixelAspectRatio_DVNTSC, kPixelAspectRatio_DVNTSCWide},
-	{kPixelFormatCompression_PALDV25,         720,  576, 144'000, kPixelAspectRatio_DVPAL,  kPixelAspectRatio_DVPALWide},
-	{kPixelFormatCompression_NTSCDV50,        720,  480, 240'000, kPixelAspectRatio_DVNTSC, kPixelAspectRatio_DVNTSCWide},
-	{kPixelFormatCompression_PALDV50,         720,  576, 288'000, kPixelAspectRatio_DVPAL,  kPixelAspectRatio_DVPALWide},
-	{kPixelFormatCompression_NTSCDV100_720p,  960,  720, 240'000, kPixelAspectRatio_Square},
-	{kPixelFormatCompression_PALDV100_720p,   960,  720, 288'000, kPixelAspectRatio_Square},
-	{kPixelFormatCompression_NTSCDV100_1080i, 1280, 1080, 480'000, kPixelAspectRatio_DVCProHD},
-	{kPixelFormatCompression_PALDV100_1080i,  1440, 1080, 576'000, kPixelAspectRatio_HDAnamorphic1080},
+	{kPixelFormatCompression_NTSCDV25,         720,  480, 120'000, kPixelAspectRatio_DVNTSC,           kPixelAspectRatio_DVNTSCWide},
+	{kPixelFormatCompression_PALDV25,          720,  576, 144'000, kPixelAspectRatio_DVPAL,            kPixelAspectRatio_DVPALWide},
+	{kPixelFormatCompression_NTSCDV50,         720,  480, 240'000, kPixelAspectRatio_DVNTSC,           kPixelAspectRatio_DVNTSCWide},
+	{kPixelFormatCompression_PALDV50,          720,  576, 288'000, kPixelAspectRatio_DVPAL,            kPixelAspectRatio_DVPALWide},
+	{kPixelFormatCompression_NTSCDV100_720p,   960,  720, 240'000, kPixelAspectRatio_Square,           kPixelAspectRatio_Square},
+	{kPixelFormatCompression_PALDV100_720p,    960,  720, 288'000, kPixelAspectRatio_Square,           kPixelAspectRatio_Square},
+	{kPixelFormatCompression_NTSCDV100_1080i, 1280, 1080, 480'000, kPixelAspectRatio_DVCProHD,         kPixelAspectRatio_DVCProHD},
+	{kPixelFormatCompression_PALDV100_1080i,  1440, 1080, 576'000, kPixelAspectRatio_HDAnamorphic1080, kPixelAspectRatio_HDAnamorphic1080},
 });
 // clang-format on
 
@@ -160,7 +160,7 @@ bool IsRectValidForFormat(PixelFormat inFormat, int inWidth, int inHeight, Pixel
 		return true;
 	const DVFrame& frame = DVFrameOf(inFormat.mProperties);
 	return inWidth == frame.mWidth && inHeight == frame.mHeight
-		&& (inRatio == frame.mShape || inRatio == frame.mWideShape);
+		&& (inRatio == frame.mShape || inRatio == frame.mOtherShape);
 }
 
 }   // namespace zonmediatypes
