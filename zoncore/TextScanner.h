@@ -68,6 +68,9 @@ public:
 	/// The next character; 0 at the end, which a text may hold, too.
 	constexpr Char Peek() const noexcept { return IsAtEnd() ? Char{} : *mNext; }
 
+	/// Reads one character; not at the end.
+	constexpr Char Next() noexcept { return *mNext++; }
+
 	/// How many code units have been read, and how many are left.
 	constexpr std::size_t GetPosition() const noexcept { return static_cast<std::size_t>(mNext - mBegin); }
 	constexpr std::size_t GetRemaining() const noexcept { return static_cast<std::size_t>(mEnd - mNext); }
@@ -87,6 +90,9 @@ public:
 	constexpr DigitRun TakeDigits(std::uint64_t inMost) noexcept;
 
 private:
+	/// Whether the number that these digits write does.
+	static constexpr bool Fits64Bits(const Char* inBegin, const Char* inEnd) noexcept;
+
 	const Char* mBegin;
 	const Char* mNext;
 	const Char* mEnd;
@@ -124,19 +130,34 @@ constexpr void TextScanner<Char>::SkipWhiteSpace() noexcept
 template <class Char>
 constexpr DigitRun TextScanner<Char>::TakeDigits(std::uint64_t inMost) noexcept
 {
-	constexpr std::uint64_t kMost = std::numeric_limits<std::uint64_t>::max();
 	const Char* const begin = mNext;
 	std::uint64_t value = 0;
-	bool isBeyond64Bits = false;
-	for (; !IsAtEnd() && IsDigit(static_cast<std::uint32_t>(*mNext)); ++mNext)
+	for (; !IsAtEnd(); ++mNext)
 	{
-		const auto digit = static_cast<std::uint64_t>(*mNext - Char{'0'});
-		if (value > kMost / 10 - 1 && value > (kMost - digit) / 10)   // the division only where it may be needed
-			isBeyond64Bits = true;
+		const std::uint32_t digit = static_cast<std::uint32_t>(*mNext) - '0';
+		if (digit > 9)
+			break;
 		value = value * 10 + digit;
 	}
-	const bool isTooLarge = isBeyond64Bits || value > inMost;
+	const bool isTooLarge = value > inMost || !Fits64Bits(begin, mNext);
 	return {isTooLarge ? inMost : value, static_cast<std::size_t>(mNext - begin), isTooLarge};
+}
+
+template <class Char>
+constexpr bool TextScanner<Char>::Fits64Bits(const Char* inBegin, const Char* inEnd) noexcept
+{
+	constexpr std::uint64_t kMost = std::numeric_limits<std::uint64_t>::max();
+	if (inEnd - inBegin <= std::numeric_limits<std::uint64_t>::digits10)
+		return true;   // as every number of so few digits
+	std::uint64_t value = 0;
+	for (; inBegin != inEnd; ++inBegin)
+	{
+		const auto digit = static_cast<std::uint64_t>(*inBegin - Char{'0'});
+		if (value > (kMost - digit) / 10)
+			return false;
+		value = value * 10 + digit;
+	}
+	return true;
 }
 
 }   // namespace zoncore::utility

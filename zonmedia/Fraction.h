@@ -1,9 +1,10 @@
 #pragma once
 
 /// \file
-/// A plain fraction, as files and people state rates.
+/// Fractions as files and people state rates.
 
-#include <compare>
+#include "zonmediatypes/TimeBase.h"
+
 #include <cstdint>
 #include <numeric>
 #include <string>
@@ -11,13 +12,7 @@
 namespace zonmedia
 {
 
-struct Fraction
-{
-	std::int64_t mNumerator = 0;
-	std::int64_t mDenominator = 1;
-
-	friend constexpr bool operator==(Fraction, Fraction) = default;
-};
+using Fraction = zonmediatypes::TimeBase::Ratio;
 
 /// The same value in lowest terms; both terms are to be above 0.
 constexpr Fraction Reduced(Fraction inFraction)

@@ -116,12 +116,13 @@ std::string Expectation(FrameRate inRate, TimeForm inForm)
 		+ (description.empty() ? "" : " (" + description + ")");
 }
 
-// 0 for what is not shown in feet and frames.
+// What the library reads as one foot; 0 where it does not show feet and frames and so rejects the "+" between them.
 std::uint64_t FramesPerFoot(TimeForm inForm)
 {
-	if (inForm.mDisplay == kTimeDisplay_16mmFeetFrames)
-		return 40;
-	return inForm.mDisplay == kTimeDisplay_35mmFeetFrames ? 16 : 0;
+	constexpr FrameRate kFrameIsTick(1);
+	const TickTime foot
+		= inForm.mDisplay ? TimecodeToTime(UTF8to16("1+0"), kFrameIsTick, *inForm.mDisplay) : kTime_Invalid;
+	return foot == kTime_Invalid ? 0 : static_cast<std::uint64_t>(foot.GetTicks());
 }
 
 // A sign, which may be missing, and one number or two with a separator between them: the library reads the rest as 0.

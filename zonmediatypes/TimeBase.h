@@ -53,7 +53,8 @@ public:
 	/// A number of seconds in lowest terms.
 	struct Ratio
 	{
-		std::int64_t mNumerator, mDenominator;
+		std::int64_t mNumerator = 0;
+		std::int64_t mDenominator = 1;
 
 		friend constexpr bool operator==(const Ratio&, const Ratio&) noexcept = default;
 	};

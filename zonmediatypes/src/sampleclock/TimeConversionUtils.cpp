@@ -106,25 +106,21 @@ struct TypedFields
 	std::int32_t mSubframeDivisor;
 };
 
-// Takes the digits off the front of ioText; 0 for a number that does not fit.
-std::int32_t TakeField(UTF16StringView& ioText)
+using Scanner = zoncore::utility::TextScanner<UTF16Char>;
+
+// The digits that come next as a number; 0 for one that does not fit.
+std::int32_t TakeField(Scanner& ioText)
 {
-	constexpr std::uint64_t kLargest = std::numeric_limits<std::int32_t>::max();
-	std::uint64_t value = 0;
-	for (; !ioText.empty() && IsDigit(ioText.front()); ioText.remove_prefix(1))
-	{
-		if (value <= kLargest)
-			value = value * 10 + (ioText.front() - std::uint64_t{'0'});
-	}
-	return value <= kLargest ? static_cast<std::int32_t>(value) : 0;
+	const auto run = ioText.TakeDigits(std::numeric_limits<std::int32_t>::max());
+	return run.mIsTooLarge ? 0 : static_cast<std::int32_t>(run.mValue);
 }
 
-// Takes the separators off the front of ioText; whether one of them was ".".
-bool TakeSeparators(UTF16StringView& ioText)
+// Skips the separators that come next; whether one of them was ".".
+bool TakeSeparators(Scanner& ioText)
 {
 	bool hasPoint = false;
-	for (; !ioText.empty() && !IsDigit(ioText.front()); ioText.remove_prefix(1))
-		hasPoint = hasPoint || ioText.front() == '.';
+	while (!ioText.IsAtEnd() && !IsDigit(ioText.Peek()))
+		hasPoint = ioText.Next() == '.' || hasPoint;
 	return hasPoint;
 }
 
@@ -140,6 +136,7 @@ TypedFields ParseTimeCodeString(UTF16StringView inText)
 {
 	constexpr std::size_t kLabels = 4;
 	constexpr std::size_t kMostFields = 5;
+	Scanner text(inText);
 	// Fields follow zeros: the four values before any end are right-aligned labels.
 	std::array<std::int32_t, kLabels + kMostFields> values{};
 	std::size_t end = kLabels;
@@ -147,11 +144,11 @@ TypedFields ParseTimeCodeString(UTF16StringView inText)
 	bool hasPoint = false;
 	for (bool isComplete = false; !isComplete && end < values.size(); isComplete = hasPoint)
 	{
-		hasPoint = TakeSeparators(inText) || hasPoint;
-		if (inText.empty())
+		hasPoint = TakeSeparators(text) || hasPoint;
+		if (text.IsAtEnd())
 			break;
-		lastFieldLength = inText.size();
-		values[end++] = TakeField(inText);
+		lastFieldLength = text.GetRemaining();
+		values[end++] = TakeField(text);
 	}
 	const bool hasFraction = hasPoint && end > kLabels;
 	const std::size_t labels = hasFraction ? end - 1 : end;

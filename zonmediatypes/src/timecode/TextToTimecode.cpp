@@ -17,9 +17,9 @@ namespace
 
 using zoncore::UTF16Char;
 using zoncore::UTF16StringView;
-using zoncore::utility::IsDigit;
+using zoncore::utility::DigitRun;
 using zoncore::utility::IsSign;
-using zoncore::utility::IsWhiteSpace;
+using zoncore::utility::TextScanner;
 using zoncore::utility::WrappingAdd;
 using zoncore::utility::WrappingMultiply;
 using zoncore::utility::WrappingNegate;
@@ -36,6 +36,8 @@ constexpr bool IsFilmSeparator(UTF16Char inChar)
 }
 
 // The groups of digits of a text, from the right; those that are missing are 0.
+constexpr int kMostGroups = 4;
+
 struct TextFields
 {
 	TimecodeFields mFields{};
@@ -57,35 +59,31 @@ bool ReadFullForm(UTF16StringView inText, TextFields& outFields)
 		isNumber &= ones < 10;
 		return tens * 10 + ones;
 	};
-	const TextFields fields{{read(0), read(3), read(6), false, read(9)}, 4};
+	const TextFields fields{{read(0), read(3), read(6), false, read(9)}, kMostGroups};
 	if (isNumber)
 		outFields = fields;
 	return isNumber;
 }
 
-// False for a text that is not one to four groups of digits, with single separators between them.
+// False for a text that is not one to four groups of digits, with single separators between them; the last may be empty.
 bool ReadFields(UTF16StringView inText, TextFields& outFields)
 {
 	constexpr std::uint64_t kMostFrames = std::numeric_limits<std::uint32_t>::max();
-	constexpr int kMostGroups = 4;
-	TextFields read;
-	TimecodeFields& fields = read.mFields;
-	bool isAfterSeparator = true;
-	for (const UTF16Char character : inText)
+	TimecodeFields fields{};
+	TextScanner scanner(inText);
+	for (int group = 1; group <= kMostGroups; ++group)
 	{
-		if (IsDigit(character))
+		const DigitRun run = scanner.TakeDigits(kMostFrames);
+		fields = {fields.mMinutes, fields.mSeconds, static_cast<std::uint32_t>(fields.mFrames), false, run.mValue};
+		if (scanner.IsAtEnd())
 		{
-			fields.mFrames = std::min<std::uint64_t>(fields.mFrames * 10 + (character - UTF16Char{'0'}), kMostFrames);
-			isAfterSeparator = false;
-			continue;
+			outFields = {fields, group};
+			return true;
 		}
-		if (!IsSeparator(character) || isAfterSeparator || ++read.mGroups > kMostGroups)
+		if (run.mCount == 0 || !IsSeparator(scanner.Next()))
 			return false;
-		fields = {fields.mMinutes, fields.mSeconds, static_cast<std::uint32_t>(fields.mFrames), false, 0};
-		isAfterSeparator = true;
 	}
-	outFields = read;
-	return true;
+	return false;
 }
 
 // A run of digits, "HHMMSSFF"; how many of them are frames depends on the rate.
@@ -128,15 +126,11 @@ TickTime ReadTimecode(UTF16StringView inText, FrameRate inRate, const TimeDispla
 // number that they do.
 std::int64_t ReadFilmNumber(UTF16StringView inText)
 {
-	const auto begin = std::ranges::find_if_not(inText, IsWhiteSpace);
-	const bool isNegative = begin != inText.end() && *begin == '-';
+	TextScanner scanner(inText);
+	scanner.SkipWhiteSpace();
+	const bool isNegative = scanner.Take('-');
 	const std::uint64_t most = std::numeric_limits<std::int64_t>::max() + std::uint64_t{isNegative};
-	std::uint64_t number = 0;
-	for (auto character = begin + isNegative; character != inText.end() && IsDigit(*character); ++character)
-	{
-		const std::uint64_t digit = *character - UTF16Char{'0'};
-		number = number > (most - digit) / 10 ? most : number * 10 + digit;
-	}
+	const std::uint64_t number = scanner.TakeDigits(most).mValue;
 	return static_cast<std::int64_t>(isNegative ? 0 - number : number);
 }
 
