@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16String.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "FuzzInput.h"
+#include "fuzz/FuzzInput.h"
 #include "zoncore/SourcePlace.h"
 
 #include <cstddef>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "FuzzInput.h"
+#include "fuzz/FuzzInput.h"
 #include "zonmediatypes/FrameRate.h"
 
 #include <cstdint>

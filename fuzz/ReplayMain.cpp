@@ -1,7 +1,7 @@
 // Runs a fuzz target over the files of the folders that are named on the command line: a regression test of every input
 // that once mattered. It fails where an invariant does not hold, and where no input reaches one of the target's checks.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "tests/TestLocale.h"
 
 #include <cstddef>

@@ -1,6 +1,6 @@
 // Rates, displays, times and layouts as they are typed on a command line: read whole or refused in one line.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zonmedia/AudioNames.h"
 #include "zonmedia/TimeNames.h"
 #include "zonmedia/VideoNames.h"

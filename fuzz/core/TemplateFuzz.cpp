@@ -1,7 +1,7 @@
 // Templates and keys whose placeholders are filled, and text that is replaced, against a walk character by character.
 
-#include "BufferChecks.h"
-#include "SmallCatalogue.h"
+#include "fuzz/BufferChecks.h"
+#include "fuzz/core/SmallCatalogue.h"
 #include "zoncore/Localizer.h"
 #include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"

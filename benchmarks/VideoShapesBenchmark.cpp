@@ -74,7 +74,7 @@ guint StreamerSmallerFrame(AVRational inRatio)
 
 [[maybe_unused]] const bool sAdded = []
 {
-	constexpr const char* kArea = "Pixel aspect ratio";
+	constexpr const char* kArea = "Video shapes";
 	Compare(kArea, "whether two are equal (exactly there)",
 		ForEach([] { return Pairs(Ratios()); }, [](const auto& inPair) { return inPair[0] == inPair[1]; }),
 		{{"libavutil",

@@ -85,7 +85,7 @@ Work Rescale(std::int64_t inUnitsPerSecond)
 template <std::int64_t inUnitsPerSecond>
 void AddBase(const std::string& inName)
 {
-	constexpr const char* kArea = "Time base";
+	constexpr const char* kArea = "Time";
 	const std::vector<Peer> peers{
 		{"GStreamer", Scale(inUnitsPerSecond), kWanted}, {"libavutil", Rescale(inUnitsPerSecond)}};
 	Compare(kArea, "ticks to " + inName + ", known base", KnownBase<inUnitsPerSecond>(), peers);
@@ -99,9 +99,9 @@ void AddBase(const std::string& inName)
 	AddBase<1'000'000>("microseconds");
 	AddBase<48'000>("samples at 48 kHz");
 	AddBase<44'100>("samples at 44.1 kHz");
-	Compare("Time base", "ticks to a fraction of seconds",
+	Compare("Time", "ticks to a fraction of seconds",
 		ForEach(Times, [](TickTime inTime) { return TimeToRatioTime(inTime); }));
-	Compare("Time base", "a fraction of seconds to ticks",
+	Compare("Time", "a fraction of seconds to ticks",
 		ForEach(
 			[]
 			{

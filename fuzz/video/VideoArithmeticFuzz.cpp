@@ -1,6 +1,6 @@
 // Pixel formats of any properties, rectangles and ratios of any integers.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelAspectRatioUtils.h"
 #include "zonmediatypes/PixelFormatSelection.h"

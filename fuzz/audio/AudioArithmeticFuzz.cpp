@@ -1,6 +1,6 @@
 // Layouts of any labels: conversion, ordering, maps, formats and descriptions.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zonmediatypes/AudioChannelLayout.h"
 #include "zonmediatypes/AudioChannelMap.h"
 #include "zonmediatypes/AudioFormat.h"

@@ -1,7 +1,7 @@
 // Bars and beats of any meter and tempo.
 
-#include "Checks.h"
-#include "SampleClockInput.h"
+#include "fuzz/Checks.h"
+#include "fuzz/sampleclock/SampleClockInput.h"
 
 #include <cmath>
 #include <string>

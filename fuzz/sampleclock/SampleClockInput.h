@@ -1,7 +1,7 @@
 #pragma once
 
-#include "BufferChecks.h"
-#include "FuzzInput.h"
+#include "fuzz/BufferChecks.h"
+#include "fuzz/FuzzInput.h"
 #include "zoncore/Debug.h"
 #include "zoncore/StringUtils.h"
 #include "zonmediatypes/TimeConversionUtils.h"

@@ -1,7 +1,7 @@
 // Film feet and frames: any text, against a reading of its own.
 
-#include "Checks.h"
-#include "Numbers.h"
+#include "fuzz/Checks.h"
+#include "fuzz/Numbers.h"
 #include "zonmediatypes/Timecode.h"
 
 #include <algorithm>

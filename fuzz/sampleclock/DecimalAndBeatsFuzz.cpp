@@ -1,8 +1,8 @@
 // Decimal time, milliseconds and beats of the sample clock.
 
-#include "Checks.h"
-#include "Numbers.h"
-#include "SampleClockInput.h"
+#include "fuzz/Checks.h"
+#include "fuzz/Numbers.h"
+#include "fuzz/sampleclock/SampleClockInput.h"
 
 #include <array>
 #include <cmath>

@@ -1,6 +1,6 @@
 // Text between its encoding forms, against a decoder of its own.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zoncore/StringUtils.h"
 
 #include <string>

@@ -1,6 +1,6 @@
 // Numbers as text and as fractions, against the C library and exact arithmetic.
 
-#include "Checks.h"
+#include "fuzz/Checks.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
 

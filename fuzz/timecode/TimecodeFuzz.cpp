@@ -1,8 +1,8 @@
 // Timecode text and ticks: any text at any rate and display, and times that must survive being written and read.
 
-#include "BufferChecks.h"
-#include "Numbers.h"
-#include "RateInput.h"
+#include "fuzz/BufferChecks.h"
+#include "fuzz/Numbers.h"
+#include "fuzz/RateInput.h"
 #include "zonmediatypes/TimeUtils.h"
 #include "zonmediatypes/Timecode.h"
 

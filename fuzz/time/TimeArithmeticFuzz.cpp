@@ -1,7 +1,7 @@
 // Arithmetic on times, rates, ratios and time bases with any integers; divisions by 0 are left out, they are faults.
 
-#include "BufferChecks.h"
-#include "RateInput.h"
+#include "fuzz/BufferChecks.h"
+#include "fuzz/RateInput.h"
 #include "zoncore/Reciprocal.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PulldownCadenceUtils.h"

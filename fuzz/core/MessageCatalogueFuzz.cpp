@@ -1,7 +1,7 @@
 // Message catalogues of any content: read whole or refused, never half, against a reading of their own.
 
-#include "Checks.h"
-#include "SmallCatalogue.h"
+#include "fuzz/Checks.h"
+#include "fuzz/core/SmallCatalogue.h"
 #include "zoncore/MessageCatalogue.h"
 
 #include <algorithm>

@@ -1,8 +1,8 @@
 // Sample-clock timecode and frame counts: any text, position and rate.
 
-#include "Checks.h"
-#include "Numbers.h"
-#include "SampleClockInput.h"
+#include "fuzz/Checks.h"
+#include "fuzz/Numbers.h"
+#include "fuzz/sampleclock/SampleClockInput.h"
 #include "zoncore/NumberConversion.h"
 
 #include <algorithm>
