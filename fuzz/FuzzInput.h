@@ -30,6 +30,8 @@ public:
 		const std::size_t count = std::min(bytes.size(), mBytes.size());
 		std::copy_n(mBytes.begin(), count, bytes.begin());
 		mBytes.remove_prefix(count);
+		if constexpr (std::endian::native == std::endian::big)   // an input means the same everywhere
+			std::ranges::reverse(bytes);
 		return std::bit_cast<Number>(bytes);
 	}
 

@@ -1,6 +1,7 @@
 # clang with libc++, of the version ZON_LIBCXX_VERSION, both of this machine. The library lies under ZON_LIBCXX_ROOT as its
 # Debian packages have it; see scripts/test-platform.
 list(APPEND CMAKE_TRY_COMPILE_PLATFORM_VARIABLES ZON_LIBCXX_VERSION ZON_LIBCXX_ROOT)
+set(CMAKE_C_COMPILER clang-${ZON_LIBCXX_VERSION})
 set(CMAKE_CXX_COMPILER clang++-${ZON_LIBCXX_VERSION})
 set(libcxx "${ZON_LIBCXX_ROOT}/usr/lib/llvm-${ZON_LIBCXX_VERSION}")
 set(CMAKE_CXX_FLAGS_INIT "-stdlib=libc++ -nostdinc++ -isystem ${libcxx}/include/c++/v1")

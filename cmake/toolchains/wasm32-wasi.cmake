@@ -2,6 +2,7 @@
 # programs. There are no threads there, no shared libraries, and an exception that is thrown ends the program.
 set(CMAKE_SYSTEM_NAME WASI)
 set(CMAKE_SYSTEM_PROCESSOR wasm32)
+set(CMAKE_C_COMPILER clang-19)
 set(CMAKE_CXX_COMPILER clang++-19)
 set(CMAKE_CXX_COMPILER_TARGET wasm32-wasi)
 set(CMAKE_AR llvm-ar-19)

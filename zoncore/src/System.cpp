@@ -10,7 +10,9 @@
 	#include <csignal>
 #endif
 #if defined(_WIN32)
-	#define NOMINMAX
+	#if !defined(NOMINMAX)
+		#define NOMINMAX
+	#endif
 	#define WIN32_LEAN_AND_MEAN
 	#include "zoncore/StringUtils.h"
 
