@@ -1,5 +1,6 @@
 #include "tests/Allocations.h"
 #include "tests/CatalogueFile.h"
+#include "tests/Platform.h"
 #include "tests/WithTranslator.h"
 #include "zoncore/CheckRegistry.h"
 #include "zoncore/Debug.h"
@@ -35,7 +36,6 @@
 #include <string>
 #include <string_view>
 #include <type_traits>
-#include <unistd.h>
 #include <utility>
 #include <vector>
 
@@ -255,7 +255,7 @@ TEST(WhenMemoryRunsOut, ErrorsAndCataloguesAreWholeOrThrown)
 		});
 	ExpectAllOrThrow([&] { return ToU16String(wide); });
 
-	const auto path = std::filesystem::temp_directory_path() / ("AllocationTest" + std::to_string(::getpid()) + ".mo");
+	const auto path = std::filesystem::temp_directory_path() / ("AllocationTest" + zontest::ProcessId() + ".mo");
 	const zontest::Messages messages = {{"", "charset=UTF-8\n"}, {"a", std::string(20'000, 'y')}};
 	std::ofstream(path, std::ios::binary) << zontest::MakeCatalogue(messages);
 	for (const char* const suffix : {"", "-that-is-not-there"})

@@ -1,3 +1,4 @@
+#include "tests/Platform.h"
 #include "zoncore/Flags.h"
 #include "zoncore/Geometry.h"
 #include "zoncore/RecursiveMutex.h"
@@ -57,9 +58,9 @@ TEST(WrappingArithmeticDeathTest, DividesByZeroWithAFault)
 {
 	testing::FLAGS_gtest_death_test_style = "threadsafe";
 	const auto zero = [](void (*inHandler)(int)) { return std::signal(SIGFPE, inHandler) == SIG_ERR ? 1 : 0; };
-	EXPECT_EXIT(utility::WrappingDivide(1, zero(SIG_DFL)), testing::KilledBySignal(SIGFPE), "");
-	EXPECT_EXIT(utility::WrappingRemainder(1, zero(SIG_DFL)), testing::KilledBySignal(SIGFPE), "");
-	EXPECT_EXIT(utility::WrappingDivide(1, zero([](int) {})), testing::KilledBySignal(SIGABRT), "");
+	EXPECT_EXIT(utility::WrappingDivide(1, zero(SIG_DFL)), zontest::EndedBy(SIGFPE), "");
+	EXPECT_EXIT(utility::WrappingRemainder(1, zero(SIG_DFL)), zontest::EndedBy(SIGFPE), "");
+	EXPECT_EXIT(utility::WrappingDivide(1, zero([](int) {})), zontest::EndedBy(SIGABRT), "");
 }
 
 // ---- Locks -----------------------------------------------------------------------------------------------------------

@@ -1,5 +1,6 @@
 #include "zonmediatypes/FrameRate.h"
 
+#include "tests/Platform.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16Stream.h"
 
@@ -117,7 +118,7 @@ TEST(FrameRateDeathTest, TimesIntegerZeroIsADivideFault)
 		std::signal(SIGFPE, SIG_DFL);   // sanitizers have a handler of their own
 		static_cast<void>(kFrameRate_Film24 * 0);
 	};
-	EXPECT_EXIT(multiply(), testing::KilledBySignal(SIGFPE), "");
+	EXPECT_EXIT(multiply(), zontest::EndedBy(SIGFPE), "");
 }
 
 TEST(FrameRate, IsOrderedByFramesASecond)

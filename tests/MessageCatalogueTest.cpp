@@ -2,6 +2,7 @@
 
 #include "tests/Allocations.h"
 #include "tests/CatalogueFile.h"
+#include "tests/Platform.h"
 #include "tests/WithTranslator.h"
 #include "zoncore/StringUtils.h"
 
@@ -13,7 +14,6 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <unistd.h>
 #include <utility>
 
 namespace
@@ -108,7 +108,7 @@ TEST(MessageCatalogue, IsReadFromFilesOfUpTo64MB)
 	EXPECT_FALSE(catalogue.Load(".", error));
 	EXPECT_THAT(error, testing::StartsWith(".: cannot be read: "));
 
-	const std::string path = testing::TempDir() + "MessageCatalogueTest-" + std::to_string(::getpid());
+	const std::string path = testing::TempDir() + "MessageCatalogueTest-" + zontest::ProcessId();
 	std::ofstream(path, std::ios::binary) << MakeCatalogue(kGerman);
 	for (const unsigned size : {64u << 20, (64u << 20) + 1})
 	{

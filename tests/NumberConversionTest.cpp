@@ -1,6 +1,7 @@
 #include "zoncore/NumberConversion.h"
 
 #include "tests/HostileLocale.h"
+#include "tests/Platform.h"
 #include "tests/Walks.h"
 #include "zoncore/StringUtils.h"
 
@@ -19,10 +20,9 @@
 #include <cstdlib>
 #include <iomanip>
 #include <limits>
-#include <locale.h>
 #include <optional>
 #include <random>
-#include <regex.h>
+#include <regex>
 #include <sstream>
 #include <string>
 #include <utility>
@@ -72,8 +72,8 @@ std::string Print(double inValue, std::ios_base::fmtflags inNotation, long inPre
 
 double ReadAsStrtod(const std::string& inText)
 {
-	static const ::locale_t sClassic = ::newlocale(LC_ALL_MASK, "C", nullptr);
-	return ::strtod_l(inText.c_str(), nullptr, sClassic);
+	const zontest::ClassicNumbers classic;
+	return std::strtod(inText.c_str(), nullptr);
 }
 
 // ---- Numbers to text -------------------------------------------------------------------------------------------------
@@ -148,20 +148,13 @@ std::optional<Number> Read(const std::string& inText)
 template <class Number>
 std::optional<Number> ReadAsRequired(const std::string& inText)
 {
-	static const regex_t sNumber = []
-	{
-		regex_t pattern;
-		EXPECT_EQ(regcomp(&pattern,
-					  std::is_integral_v<Number> ? "^[ \t\n\v\f\r]*[-+]?[0-9]+"
-												 : "^[ \t\n\v\f\r]*[-+]?([0-9]+\\.?[0-9]*|\\.[0-9]+)([eE][-+]?[0-9]+)?",
-					  REG_EXTENDED),
-			0);
-		return pattern;
-	}();
-	regmatch_t match;
-	if (regexec(&sNumber, inText.c_str(), 1, &match, 0) != 0)
+	static const std::regex sNumber(std::is_integral_v<Number>
+			? "[ \t\n\v\f\r]*[-+]?[0-9]+"
+			: "[ \t\n\v\f\r]*[-+]?([0-9]+\\.?[0-9]*|\\.[0-9]+)([eE][-+]?[0-9]+)?");
+	std::smatch match;
+	if (!std::regex_search(inText, match, sNumber, std::regex_constants::match_continuous))
 		return std::nullopt;
-	const std::string number(inText, 0, static_cast<std::size_t>(match.rm_eo));
+	const std::string number = match.str();
 	if constexpr (std::is_integral_v<Number>)
 	{
 		errno = 0;

@@ -1,5 +1,6 @@
 #include "zonmediatypes/TickTime.h"
 
+#include "tests/Platform.h"
 #include "zoncore/Debug.h"
 #include "zoncore/Error.h"
 #include "zoncore/StringUtils.h"
@@ -237,7 +238,7 @@ TEST(ZeroDivisorDeathTest, OfAnIntegerIsADivideFaultAfterItsReports)
 		return testing::AllOf(testing::HasSubstr(place + "zonmediatypes::TickTime::operator/(" + inType + ") const"),
 			testing::HasSubstr(place + "&zonmediatypes::TickTime::operator/=(" + inType + ")"));
 	};
-	const testing::KilledBySignal isFault(SIGFPE);
+	const zontest::EndedBy isFault(SIGFPE);
 	EXPECT_EXIT(divide(0, std::divides<>()), isFault, reports("std::int32_t"));
 	EXPECT_EXIT(divide(0u, std::divides<>()), isFault, reports("std::uint32_t"));
 	EXPECT_EXIT(divide(0ull, std::divides<>()), isFault, testing::HasSubstr("TickTime::operator/=(WideInteger)"));

@@ -1,6 +1,7 @@
 // Numbers as text and as fractions, against the C library and exact arithmetic.
 
 #include "fuzz/Checks.h"
+#include "tests/Platform.h"
 #include "zoncore/NumberConversion.h"
 #include "zoncore/StringUtils.h"
 
@@ -55,25 +56,6 @@ void CheckInteger(const UTF16String& inText, const std::string& inNarrow)
 	Require(value == (isExpected ? expected : 0), "integers have the value that strtoll reads");
 }
 
-// What the C library reads and writes has a decimal point for as long as this lives, whatever locale the run is under.
-class ClassicNumbers
-{
-public:
-	ClassicNumbers() : mBefore(::uselocale(Classic())) {}
-	ClassicNumbers(const ClassicNumbers&) = delete;
-	ClassicNumbers& operator=(const ClassicNumbers&) = delete;
-	~ClassicNumbers() { ::uselocale(mBefore); }
-
-private:
-	static ::locale_t Classic()
-	{
-		static const ::locale_t sClassic = ::newlocale(LC_ALL_MASK, "C", nullptr);
-		return sClassic;
-	}
-
-	::locale_t mBefore;
-};
-
 void CheckReading(FuzzInput& ioInput)
 {
 	const UTF16String text = ioInput.Text();
@@ -81,7 +63,7 @@ void CheckReading(FuzzInput& ioInput)
 	CheckInteger<int>(text, narrow);
 	CheckInteger<long long>(text, narrow);
 	char* end = nullptr;
-	const double expected = (ClassicNumbers(), std::strtod(narrow.c_str(), &end));
+	const double expected = (zontest::ClassicNumbers(), std::strtod(narrow.c_str(), &end));
 	double value = 99;
 	Require(StringToNumber(text, value, 0) == (end != narrow.c_str()), "doubles are taken and refused as by strtod");
 	Require(IsSame(value, end != narrow.c_str() ? expected : 0), "doubles have the value that strtod reads");
@@ -95,7 +77,7 @@ std::string Expected(double inValue, std::size_t inDigits, std::size_t inDecimal
 		return "nan";
 	if (std::isinf(inValue))
 		return inValue < 0 ? "-inf" : "inf";
-	const ClassicNumbers classic;
+	const zontest::ClassicNumbers classic;
 	char buffer[1'500];
 	std::snprintf(
 		buffer, sizeof buffer, "%.*f", static_cast<int>(std::min(inDecimals, std::size_t{1'100})), std::abs(inValue));

@@ -17,7 +17,31 @@ namespace
 
 #if ZONCORE_SMALL_BLOCK_POOL
 
-constexpr std::size_t kGranule = alignof(std::max_align_t);
+// What compilers of this family understand.
+	#if defined(__GNUC__)
+		#define ZONCORE_NOINLINE [[gnu::noinline]]
+	#else
+		#define ZONCORE_NOINLINE
+	#endif
+
+// Initial-exec: one instruction instead of a call on every access. The cache fits the room that the system keeps for
+// libraries that are loaded late.
+	#if defined(__ELF__)
+		#define ZONCORE_TLS_MODEL [[gnu::tls_model("initial-exec")]]
+	#else
+		#define ZONCORE_TLS_MODEL
+	#endif
+
+// g++ for Windows takes the plain variables of a thread away before the thread's other destructors run, which may still
+// dispose of blocks: there every block comes from the depot.
+	#if defined(__MINGW32__) && !defined(__clang__)
+		#define ZONCORE_THREAD_CACHES 0
+	#else
+		#define ZONCORE_THREAD_CACHES 1
+	#endif
+
+constexpr std::size_t kGranule = 16;   // the alignment of any scalar type, everywhere
+static_assert(kGranule % alignof(std::max_align_t) == 0);
 constexpr std::size_t kSizeClasses = 16;
 constexpr std::size_t kLargestPooled = kGranule * kSizeClasses;
 constexpr std::size_t kBatch = 32;               // blocks that travel between a thread and the depot at once
@@ -110,6 +134,8 @@ union Depots
 };
 constinit Depots sDepots;
 
+	#if ZONCORE_THREAD_CACHES
+
 enum class CacheState : std::uint8_t
 {
 	Unused,   // the thread has not disposed of anything yet: its end is not watched
@@ -123,9 +149,7 @@ struct ThreadCache
 	CacheState mState;
 };
 
-// Initial-exec: one instruction instead of a call on every access. The cache fits the room that the system keeps for
-// libraries that are loaded late.
-[[gnu::tls_model("initial-exec")]] constinit thread_local ThreadCache sCache{};
+ZONCORE_TLS_MODEL constinit thread_local ThreadCache sCache{};
 
 struct CacheCloser
 {
@@ -144,7 +168,7 @@ void WatchThreadEnd()
 	sCache.mState = CacheState::Open;
 }
 
-[[gnu::noinline]] void* AllocateFromDepot(std::size_t inClass)
+ZONCORE_NOINLINE void* AllocateFromDepot(std::size_t inClass)
 {
 	if (sCache.mState == CacheState::Unused)
 		WatchThreadEnd();
@@ -153,7 +177,7 @@ void WatchThreadEnd()
 	return list.Pop();
 }
 
-[[gnu::noinline]] void DisposeSlowly(void* inBlock, std::size_t inClass)
+ZONCORE_NOINLINE void DisposeSlowly(void* inBlock, std::size_t inClass)
 {
 	if (sCache.mState == CacheState::Unused)
 		WatchThreadEnd();
@@ -164,6 +188,8 @@ void WatchThreadEnd()
 	else if (list.mCount > kMostKept)
 		sDepots.mDepots[inClass].Give(list, kBatch);
 }
+
+	#endif   // ZONCORE_THREAD_CACHES
 
 #endif   // ZONCORE_SMALL_BLOCK_POOL
 
@@ -176,8 +202,14 @@ void* SmallBlockAllocator::Allocate(std::size_t inSize)
 	if (inSize > kLargestPooled)
 		return ::operator new(inSize);
 	const std::size_t sizeClass = SizeClass(inSize);
+	#if ZONCORE_THREAD_CACHES
 	BlockList& list = sCache.mLists[sizeClass];
 	return list.mFirst != nullptr ? list.Pop() : AllocateFromDepot(sizeClass);
+	#else
+	BlockList list{};
+	sDepots.mDepots[sizeClass].Take(list, 1, ClassBytes(sizeClass));
+	return list.Pop();
+	#endif
 }
 
 void SmallBlockAllocator::Dispose(void* inBlock, std::size_t inSize) noexcept
@@ -187,10 +219,16 @@ void SmallBlockAllocator::Dispose(void* inBlock, std::size_t inSize) noexcept
 	if (inSize > kLargestPooled)
 		return ::operator delete(inBlock);
 	const std::size_t sizeClass = SizeClass(inSize);
+	#if ZONCORE_THREAD_CACHES
 	BlockList& list = sCache.mLists[sizeClass];
 	if (sCache.mState != CacheState::Open || list.mCount >= kMostKept)
 		return DisposeSlowly(inBlock, sizeClass);
 	list.Push(inBlock);
+	#else
+	BlockList list{};
+	list.Push(inBlock);
+	sDepots.mDepots[sizeClass].Give(list, 1);
+	#endif
 }
 
 #else

@@ -1,0 +1,96 @@
+#pragma once
+
+#include <cstdlib>
+#include <string>
+
+#if defined(_WIN32)
+	#include <csignal>
+	#include <process.h>
+#elif !defined(__wasi__)
+	#include <csignal>
+	#include <locale.h>
+	#include <sys/wait.h>
+	#include <unistd.h>
+	#if defined(__APPLE__)
+		#include <xlocale.h>
+	#endif
+#endif
+
+// What tests ask the system for, and each system has in its own way.
+
+namespace zontest
+{
+
+/// A number that no other process has now.
+inline std::string ProcessId()
+{
+#if defined(_WIN32)
+	return std::to_string(::_getpid());
+#elif defined(__wasi__)
+	return "0";
+#else
+	return std::to_string(::getpid());
+#endif
+}
+
+/// What the C library reads and writes has a decimal point for as long as this lives, whatever locale the run is under.
+class ClassicNumbers
+{
+public:
+#if defined(_WIN32) || defined(__wasi__)
+	ClassicNumbers()
+	{
+	}   // there only the program itself changes the C library's locale, and tests do not
+	ClassicNumbers(const ClassicNumbers&) = delete;
+	ClassicNumbers& operator=(const ClassicNumbers&) = delete;
+	~ClassicNumbers()
+	{
+	}
+#else
+	ClassicNumbers() : mBefore(::uselocale(Classic()))
+	{
+	}
+	ClassicNumbers(const ClassicNumbers&) = delete;
+	ClassicNumbers& operator=(const ClassicNumbers&) = delete;
+	~ClassicNumbers()
+	{
+		::uselocale(mBefore);
+	}
+
+private:
+	static ::locale_t Classic()
+	{
+		static const ::locale_t sClassic = ::newlocale(LC_ALL_MASK, "C", nullptr);
+		return sClassic;
+	}
+
+	::locale_t mBefore;
+#endif
+};
+
+#if !defined(__wasi__)
+
+/// A predicate of EXPECT_EXIT: the process ended as this signal ends one that does not handle it. Windows has exit codes
+/// for that.
+class EndedBy
+{
+public:
+	explicit EndedBy(int inSignal) : mSignal(inSignal) {}
+
+	bool operator()(int inStatus) const
+	{
+	#if defined(_WIN32)
+		constexpr int kAbort = 3;
+		return inStatus == kAbort && (mSignal == SIGFPE || mSignal == SIGABRT);
+	#else
+		return WIFSIGNALED(inStatus) && WTERMSIG(inStatus) == mSignal;
+	#endif
+	}
+
+private:
+	int mSignal;
+};
+
+#endif
+
+}   // namespace zontest
