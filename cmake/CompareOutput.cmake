@@ -1,7 +1,8 @@
 # Runs a program and fails unless it succeeds and writes exactly what a file holds.
 #   cmake -DPROGRAM=... [-DARGUMENT=...] [-DEMULATOR=...] -DEXPECTED=FILE -P CompareOutput.cmake
-# With -DUPDATE=ON the file is written instead. The emulator, if there is one, is a command that runs the program.
+# With -DUPDATE=ON the file is written instead. The emulator, if there is one, is a command line that the program is added to.
 
+separate_arguments(EMULATOR)
 execute_process(COMMAND ${EMULATOR} "${PROGRAM}" ${ARGUMENT} OUTPUT_VARIABLE output RESULT_VARIABLE status)
 if(NOT status EQUAL 0)
 	message(FATAL_ERROR "${PROGRAM} ${ARGUMENT} ended with ${status}")

@@ -36,6 +36,9 @@ elseif(APPLE)
 endif()
 string(REPLACE "LINKER:" "-Wl," ZON_TAKE_ENTRY_POINT_OPTION "${ZON_TAKE_ENTRY_POINT}")   # for pkg-config's file
 
+# What runs a program of the target's system here, as one text: lists do not survive every command line.
+list(JOIN CMAKE_CROSSCOMPILING_EMULATOR " " ZON_EMULATOR)
+
 # The big headers of others are compiled once; ccache, where it is used, does better without.
 set(ZON_PRECOMPILE ON)
 if(CMAKE_CXX_COMPILER_LAUNCHER MATCHES ccache)
