@@ -74,8 +74,10 @@ TEST(FrameRate, HasTheNamedDurationsAndTheirTexts)
 		EXPECT_EQ(*listed++, rate);
 		EXPECT_EQ(Text<char>(rate), text);
 		EXPECT_EQ(zoncore::utility::UTF16to8(zoncore::utility::Coercion(rate)), text);
+#if ZONCORE_HAS_BYTE_STREAMS
 		const auto bytes = Text<unsigned char>(rate);
 		EXPECT_EQ(std::string(bytes.begin(), bytes.end()), text);
+#endif
 	}
 }
 

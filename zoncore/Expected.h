@@ -14,6 +14,8 @@
 /// same type. Copying, moving and destroying cost what they cost for the value or the reason, and are trivial where those
 /// are.
 
+#include "zoncore/Requirements.h"
+
 #include <concepts>
 #include <cstddef>
 #include <exception>

@@ -12,6 +12,8 @@
 /// Characters are those of ASCII, in text of any character type; digits of other scripts are no digits. Nothing here
 /// allocates, throws or depends on a locale.
 
+#include "zoncore/Requirements.h"
+
 #include <cstddef>
 #include <cstdint>
 #include <limits>

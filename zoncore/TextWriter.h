@@ -10,6 +10,7 @@
 #include <charconv>
 #include <concepts>
 #include <cstddef>
+#include <cstdint>
 #include <span>
 #include <string_view>
 
@@ -20,7 +21,7 @@ inline constexpr std::size_t kLongestInteger = 20;   // characters of a 64-bit i
 
 /// Writes two digits of a number below 100; the end of what was written.
 template <class Char>
-Char* WriteTwoDigits(std::size_t inNumber, Char* outText) noexcept
+Char* WriteTwoDigits(std::uint64_t inNumber, Char* outText) noexcept
 {
 	static constexpr auto kPairs = []
 	{
@@ -29,8 +30,8 @@ Char* WriteTwoDigits(std::size_t inNumber, Char* outText) noexcept
 			pairs[number] = {static_cast<Char>('0' + number / 10), static_cast<Char>('0' + number % 10)};
 		return pairs;
 	}();
-	outText[0] = kPairs[inNumber][0];
-	outText[1] = kPairs[inNumber][1];
+	outText[0] = kPairs[static_cast<std::size_t>(inNumber)][0];
+	outText[1] = kPairs[static_cast<std::size_t>(inNumber)][1];
 	return outText + 2;
 }
 
@@ -62,7 +63,7 @@ public:
 	}
 
 	/// inNumber is below 100.
-	void PutTwoDigits(std::size_t inNumber) noexcept { mEnd = WriteTwoDigits(inNumber, mEnd); }
+	void PutTwoDigits(std::uint64_t inNumber) noexcept { mEnd = WriteTwoDigits(inNumber, mEnd); }
 
 	/// inNumber in decimal, padded with zeros to inWidth characters as a stream pads: in front of a minus sign, too.
 	template <std::integral Integer>

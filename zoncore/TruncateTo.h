@@ -3,6 +3,8 @@
 /// \file
 /// The one way in which a double becomes an integer.
 
+#include "zoncore/Requirements.h"
+
 #include <concepts>
 #include <cstdint>
 #include <limits>

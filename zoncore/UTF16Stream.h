@@ -22,6 +22,7 @@
 #include <cstddef>
 #include <ios>
 #include <istream>
+#include <iterator>
 #include <locale>
 #include <ostream>
 #include <sstream>
@@ -29,16 +30,82 @@
 #include <string>
 #include <utility>
 
+namespace zoncore
+{
+
+#if defined(__GLIBCXX__)
+using UTF16CtypeBase = std::__ctype_abstract_base<UTF16Char>;
+#else
+/// The interface of std::ctype, for standard libraries that have none that others can implement.
+class ZONCORE_API UTF16CtypeBase : public std::locale::facet, public std::ctype_base
+{
+public:
+	using char_type = UTF16Char;
+
+	bool is(mask inMask, char_type inChar) const { return do_is(inMask, inChar); }
+	const char_type* is(const char_type* inBegin, const char_type* inEnd, mask* outMasks) const
+	{
+		return do_is(inBegin, inEnd, outMasks);
+	}
+	const char_type* scan_is(mask inMask, const char_type* inBegin, const char_type* inEnd) const
+	{
+		return do_scan_is(inMask, inBegin, inEnd);
+	}
+	const char_type* scan_not(mask inMask, const char_type* inBegin, const char_type* inEnd) const
+	{
+		return do_scan_not(inMask, inBegin, inEnd);
+	}
+	char_type toupper(char_type inChar) const { return do_toupper(inChar); }
+	const char_type* toupper(char_type* ioBegin, const char_type* inEnd) const { return do_toupper(ioBegin, inEnd); }
+	char_type tolower(char_type inChar) const { return do_tolower(inChar); }
+	const char_type* tolower(char_type* ioBegin, const char_type* inEnd) const { return do_tolower(ioBegin, inEnd); }
+	char_type widen(char inChar) const { return do_widen(inChar); }
+	const char* widen(const char* inBegin, const char* inEnd, char_type* outChars) const
+	{
+		return do_widen(inBegin, inEnd, outChars);
+	}
+	char narrow(char_type inChar, char inDefault) const { return do_narrow(inChar, inDefault); }
+	const char_type* narrow(const char_type* inBegin, const char_type* inEnd, char inDefault, char* outChars) const
+	{
+		return do_narrow(inBegin, inEnd, inDefault, outChars);
+	}
+
+protected:
+	explicit UTF16CtypeBase(std::size_t inReferences) : std::locale::facet(inReferences) {}
+	~UTF16CtypeBase() override;
+
+	virtual bool do_is(mask inMask, char_type inChar) const = 0;
+	virtual const char_type* do_is(const char_type* inBegin, const char_type* inEnd, mask* outMasks) const = 0;
+	virtual const char_type* do_scan_is(mask inMask, const char_type* inBegin, const char_type* inEnd) const = 0;
+	virtual const char_type* do_scan_not(mask inMask, const char_type* inBegin, const char_type* inEnd) const = 0;
+	virtual char_type do_toupper(char_type inChar) const = 0;
+	virtual const char_type* do_toupper(char_type* ioBegin, const char_type* inEnd) const = 0;
+	virtual char_type do_tolower(char_type inChar) const = 0;
+	virtual const char_type* do_tolower(char_type* ioBegin, const char_type* inEnd) const = 0;
+	virtual char_type do_widen(char inChar) const = 0;
+	virtual const char* do_widen(const char* inBegin, const char* inEnd, char_type* outChars) const = 0;
+	virtual char do_narrow(char_type inChar, char inDefault) const = 0;
+	virtual const char_type* do_narrow(
+		const char_type* inBegin, const char_type* inEnd, char inDefault, char* outChars) const = 0;
+};
+#endif
+
+/// The facets that read and write numbers on 16-bit streams.
+using UTF16NumberReader = std::num_get<UTF16Char, std::istreambuf_iterator<UTF16Char, UTF16CharTraits>>;
+using UTF16NumberWriter = std::num_put<UTF16Char, std::ostreambuf_iterator<UTF16Char, UTF16CharTraits>>;
+
+}   // namespace zoncore
+
 /// Classification and case of ASCII; every code unit above 7F is of no class and its own upper and lower case.
 template <>
-class ZONCORE_API std::ctype<zoncore::UTF16Char> : public std::__ctype_abstract_base<zoncore::UTF16Char>
+class ZONCORE_API std::ctype<zoncore::UTF16Char> : public zoncore::UTF16CtypeBase
 {
 public:
 	using char_type = zoncore::UTF16Char;
 
 	static std::locale::id id;
 
-	explicit ctype(std::size_t inReferences = 0) : std::__ctype_abstract_base<char_type>(inReferences) {}
+	explicit ctype(std::size_t inReferences = 0) : zoncore::UTF16CtypeBase(inReferences) {}
 
 protected:
 	~ctype() override = default;
@@ -64,7 +131,7 @@ class ZONCORE_API std::numpunct<zoncore::UTF16Char> : public std::locale::facet
 {
 public:
 	using char_type = zoncore::UTF16Char;
-	using string_type = std::basic_string<char_type>;
+	using string_type = std::basic_string<char_type, zoncore::UTF16CharTraits>;
 
 	static std::locale::id id;
 
@@ -86,8 +153,10 @@ protected:
 	virtual string_type do_falsename() const;
 };
 
-extern template class ZONCORE_API std::num_get<zoncore::UTF16Char>;
-extern template class ZONCORE_API std::num_put<zoncore::UTF16Char>;
+extern template class ZONCORE_API
+	std::num_get<zoncore::UTF16Char, std::istreambuf_iterator<zoncore::UTF16Char, zoncore::UTF16CharTraits>>;
+extern template class ZONCORE_API
+	std::num_put<zoncore::UTF16Char, std::ostreambuf_iterator<zoncore::UTF16Char, zoncore::UTF16CharTraits>>;
 
 namespace zoncore
 {

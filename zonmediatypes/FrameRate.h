@@ -161,8 +161,10 @@ struct FewerFramesPerSecond
 /// the stream have no effect.
 ZONMEDIATYPES_API std::basic_ostream<char>& operator<<(std::basic_ostream<char>& inStream, FrameRate inRate);
 ZONMEDIATYPES_API zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, FrameRate inRate);
+#if ZONCORE_HAS_BYTE_STREAMS
 ZONMEDIATYPES_API std::basic_ostream<unsigned char>& operator<<(
 	std::basic_ostream<unsigned char>& inStream, FrameRate inRate);
+#endif
 
 // ---- Inline implementation -------------------------------------------------------------------------------------------
 

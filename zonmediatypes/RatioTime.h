@@ -3,6 +3,8 @@
 /// \file
 /// The names of exact times in seconds. Using such a time takes TimeUtils.h, which defines it.
 
+#include "zoncore/Requirements.h"
+
 namespace boost
 {
 

@@ -41,11 +41,10 @@ std::string_view TextOf(const config::MessageCatalogue* inCatalogue, std::string
 }
 
 // Takes a template of UTF-16 or of ASCII apart: calls inChar for each character that stays, inText for each replacement.
-template <class Char, class OnChar, class OnText>
-void TakeApart(
-	std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements, OnChar inChar, OnText inText)
+template <class View, class OnChar, class OnText>
+void TakeApart(View inTemplate, std::span<const UTF16String> inReplacements, OnChar inChar, OnText inText)
 {
-	for (const Char *next = inTemplate.data(), *const end = next + inTemplate.size(); next != end; ++next)
+	for (const auto *next = inTemplate.data(), *const end = next + inTemplate.size(); next != end; ++next)
 	{
 		const std::size_t index = *next == '@' && next + 1 != end ? static_cast<std::size_t>(next[1]) - '0' : 10;
 		if (index >= 10 || index >= inReplacements.size())
@@ -58,8 +57,8 @@ void TakeApart(
 	}
 }
 
-template <class Char>
-std::size_t FilledLength(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
+template <class View>
+std::size_t FilledLength(View inTemplate, std::span<const UTF16String> inReplacements)
 {
 	std::size_t length = 0;
 	TakeApart(
@@ -68,8 +67,8 @@ std::size_t FilledLength(std::basic_string_view<Char> inTemplate, std::span<cons
 	return length;
 }
 
-template <class Char>
-void Fill(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements, UTF16Char* outText)
+template <class View>
+void Fill(View inTemplate, std::span<const UTF16String> inReplacements, UTF16Char* outText)
 {
 	TakeApart(
 		inTemplate, inReplacements, [&](UTF16Char inChar) { *outText++ = inChar; },
@@ -80,8 +79,8 @@ void Fill(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> 
 		});
 }
 
-template <class Char>
-UTF16String Filled(std::basic_string_view<Char> inTemplate, std::span<const UTF16String> inReplacements)
+template <class View>
+UTF16String Filled(View inTemplate, std::span<const UTF16String> inReplacements)
 {
 	UTF16String filled(FilledLength(inTemplate, inReplacements), 0);
 	Fill(inTemplate, inReplacements, filled.data());

@@ -150,13 +150,15 @@ double ReadDecimal(UTF16StringView inText)
 {
 	const auto isMark = [](UTF16Char inChar) { return (inChar | 0x20) == 'e'; };
 	const auto isSignificant = [](UTF16Char inChar) { return inChar >= '1' && inChar <= '9'; };
-	const UTF16Char* const mark = std::ranges::find_if(inText, isMark);
-	const UTF16Char* const point = std::find(inText.begin(), mark, UTF16Char{'.'});
-	const UTF16Char* const first = std::find_if(inText.begin(), mark, isSignificant);
+	const UTF16Char* const begin = inText.data();
+	const UTF16Char* const end = begin + inText.size();
+	const UTF16Char* const mark = std::find_if(begin, end, isMark);
+	const UTF16Char* const point = std::find(begin, mark, UTF16Char{'.'});
+	const UTF16Char* const first = std::find_if(begin, mark, isSignificant);
 	if (first == mark)
 		return 0;
 	const std::int64_t place = first < point ? point - first : point - first + 1;
-	const std::int64_t exponent = mark == inText.end() ? 0 : ReadExponent({mark + 1, inText.end()});
+	const std::int64_t exponent = mark == end ? 0 : ReadExponent({mark + 1, end});
 	return SignificantDigits({first, mark}).Scaled(place + exponent);
 }
 

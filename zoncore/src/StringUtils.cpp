@@ -24,10 +24,11 @@ constexpr bool IsAscii(Char inChar)
 }
 
 // The length of the ASCII text at the start of inText.
-template <class Char>
-std::size_t CountAscii(std::basic_string_view<Char> inText)
+template <class View>
+std::size_t CountAscii(View inText)
 {
-	return static_cast<std::size_t>(std::ranges::find_if_not(inText, IsAscii<Char>) - inText.begin());
+	const auto isAscii = IsAscii<typename View::value_type>;
+	return static_cast<std::size_t>(std::ranges::find_if_not(inText, isAscii) - inText.begin());
 }
 
 struct Decoded

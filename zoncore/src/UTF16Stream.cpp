@@ -28,6 +28,10 @@ std::ctype_base::mask Classify(UTF16Char inChar)
 
 }   // namespace
 
+#if !defined(__GLIBCXX__)
+zoncore::UTF16CtypeBase::~UTF16CtypeBase() = default;
+#endif
+
 std::locale::id std::ctype<UTF16Char>::id;
 
 bool std::ctype<UTF16Char>::do_is(mask inMask, char_type inChar) const
@@ -115,18 +119,18 @@ std::string std::numpunct<UTF16Char>::do_grouping() const
 	return {};
 }
 
-std::basic_string<UTF16Char> std::numpunct<UTF16Char>::do_truename() const
+std::numpunct<UTF16Char>::string_type std::numpunct<UTF16Char>::do_truename() const
 {
 	return {'t', 'r', 'u', 'e'};
 }
 
-std::basic_string<UTF16Char> std::numpunct<UTF16Char>::do_falsename() const
+std::numpunct<UTF16Char>::string_type std::numpunct<UTF16Char>::do_falsename() const
 {
 	return {'f', 'a', 'l', 's', 'e'};
 }
 
-template class std::num_get<UTF16Char>;
-template class std::num_put<UTF16Char>;
+template class std::num_get<UTF16Char, std::istreambuf_iterator<UTF16Char, zoncore::UTF16CharTraits>>;
+template class std::num_put<UTF16Char, std::ostreambuf_iterator<UTF16Char, zoncore::UTF16CharTraits>>;
 
 namespace
 {
@@ -167,7 +171,8 @@ std::locale With(const std::locale& inLocale)
 const std::locale& zoncore::ClassicUTF16Locale()
 {
 	// Never destroyed, for the same reason.
-	static const std::locale& sLocale = *new std::locale(With<std::num_get<UTF16Char>>(With<std::num_put<UTF16Char>>(
-		With<std::numpunct<UTF16Char>>(With<std::ctype<UTF16Char>>(std::locale::classic())))));
+	static const std::locale& sLocale
+		= *new std::locale(With<zoncore::UTF16NumberReader>(With<zoncore::UTF16NumberWriter>(
+			With<std::numpunct<UTF16Char>>(With<std::ctype<UTF16Char>>(std::locale::classic())))));
 	return sLocale;
 }

@@ -68,10 +68,12 @@ zoncore::UTF16OutputStream& operator<<(zoncore::UTF16OutputStream& inStream, Fra
 	return inStream << RateText(inRate);
 }
 
+#if ZONCORE_HAS_BYTE_STREAMS
 std::basic_ostream<unsigned char>& operator<<(std::basic_ostream<unsigned char>& inStream, FrameRate inRate)
 {
 	const std::string text = zoncore::utility::UTF16to8(RateText(inRate));
 	return inStream << std::basic_string<unsigned char>(text.begin(), text.end());
 }
+#endif
 
 }   // namespace zonmediatypes
