@@ -8,11 +8,14 @@
 #include <sstream>
 #include <utility>
 
+#if ZON_HAS_GSTREAMER
+	#include <gst/gst.h>
+#endif
+
 extern "C"
 {
 #include <libavutil/avutil.h>
 }
-#include <gst/gst.h>
 
 namespace benchmarks
 {
@@ -85,7 +88,12 @@ std::string Processor()
 
 std::string Peers()
 {
-	return std::string("FFmpeg ") + av_version_info() + ", " + gst_version_string();
+	const std::string libav = std::string("FFmpeg ") + av_version_info();
+#if ZON_HAS_GSTREAMER
+	return libav + ", " + gst_version_string();
+#else
+	return libav;
+#endif
 }
 
 void WriteArea(std::ostream& outStream, const Collector& inCollector, const std::string& inArea)
@@ -134,6 +142,8 @@ void Compare(std::string inArea, std::string inWhat, Work inOurs, std::vector<Pe
 	Register(row.NameOf(kOurs), std::move(inOurs));
 	for (Peer& peer : inPeers)
 	{
+		if (!peer.mWork)
+			continue;
 		Register(row.NameOf(peer.mLibrary), std::move(peer.mWork));
 		row.mPeers.emplace_back(peer.mLibrary, peer.mWanted);
 	}

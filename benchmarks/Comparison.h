@@ -23,7 +23,7 @@ using Work = std::function<void(benchmark::State&)>;
 struct Peer
 {
 	std::string mLibrary;
-	Work mWork;
+	Work mWork;           ///< none where the library was not there when this was built: the row is left out
 	double mWanted = 0;   ///< how many times as fast ours has to be; 0 where no number was set
 };
 

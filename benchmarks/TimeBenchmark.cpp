@@ -7,10 +7,13 @@
 
 #include <array>
 #include <cstdint>
-#include <gst/gst.h>
 #include <numeric>
 #include <string>
 #include <vector>
+
+#if ZON_HAS_GSTREAMER
+	#include <gst/gst.h>
+#endif
 
 extern "C"
 {
@@ -65,6 +68,8 @@ Work RunTimeBaseToTicks(std::int64_t inUnitsPerSecond)
 }
 
 // The peers get their fraction in lowest terms, as ours is.
+#if ZON_HAS_GSTREAMER
+
 Work Scale(std::int64_t inUnitsPerSecond)
 {
 	const std::int64_t common = std::gcd(inUnitsPerSecond, kTicksPerSecond);
@@ -73,6 +78,15 @@ Work Scale(std::int64_t inUnitsPerSecond)
 			ticks = static_cast<guint64>(kTicksPerSecond / common)](TickTime inTime)
 		{ return gst_util_uint64_scale_round(static_cast<guint64>(inTime.GetTicks()), units, ticks); });
 }
+
+#else
+
+Work Scale(std::int64_t)
+{
+	return {};
+}
+
+#endif
 
 Work Rescale(std::int64_t inUnitsPerSecond)
 {

@@ -8,10 +8,13 @@
 
 #include <array>
 #include <cstdint>
-#include <gst/video/video.h>
 #include <string>
 #include <string_view>
 #include <vector>
+
+#if ZON_HAS_GSTREAMER
+	#include <gst/video/video.h>
+#endif
 
 extern "C"
 {
@@ -140,6 +143,8 @@ Work PeerTextIn(const Case& inCase)
 		});
 }
 
+#if ZON_HAS_GSTREAMER
+
 // A timecode of no day in particular.
 GstVideoTimeCode StreamerTimecode(const Case& inCase, guint inHours, guint inMinutes, guint inSeconds, guint inFrames)
 {
@@ -202,6 +207,30 @@ Work StreamerTextIn(const Case& inCase)
 			return gst_video_time_code_frames_since_daily_jam(&timecode);
 		});
 }
+
+#else
+
+Work StreamerFieldsOut(const Case&)
+{
+	return {};
+}
+
+Work StreamerTextOut(const Case&)
+{
+	return {};
+}
+
+Work StreamerFieldsIn(const Case&)
+{
+	return {};
+}
+
+Work StreamerTextIn(const Case&)
+{
+	return {};
+}
+
+#endif
 
 // ---- Ours ------------------------------------------------------------------------------------------------------------
 

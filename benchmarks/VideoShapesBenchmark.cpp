@@ -6,8 +6,11 @@
 #include "zonmediatypes/PixelAspectRatioUtils.h"
 
 #include <array>
-#include <gst/video/video.h>
 #include <vector>
+
+#if ZON_HAS_GSTREAMER
+	#include <gst/video/video.h>
+#endif
 
 extern "C"
 {
@@ -63,6 +66,8 @@ AVRational SmallerFrame(AVRational inRatio)
 	return av_mul_q(av_mul_q(inRatio, {kOriginal.right, kOriginal.bottom}), {kDownsampled.bottom, kDownsampled.right});
 }
 
+#if ZON_HAS_GSTREAMER
+
 guint StreamerSmallerFrame(AVRational inRatio)
 {
 	guint numerator = 0;
@@ -71,6 +76,20 @@ guint StreamerSmallerFrame(AVRational inRatio)
 		static_cast<guint>(inRatio.num), static_cast<guint>(inRatio.den), kDownsampled.right, kDownsampled.bottom);
 	return numerator;
 }
+
+Work StreamerSmallerFrames()
+{
+	return ForEach(PeerRatios, StreamerSmallerFrame);
+}
+
+#else
+
+Work StreamerSmallerFrames()
+{
+	return {};
+}
+
+#endif
 
 [[maybe_unused]] const bool sAdded = []
 {
@@ -94,7 +113,7 @@ guint StreamerSmallerFrame(AVRational inRatio)
 		ForEach(Ratios,
 			[](PixelAspectRatio inRatio)
 			{ return AdjustPixelAspectRatioForNonUniformDownsample(inRatio, kOriginal, kDownsampled); }),
-		{{"libavutil", ForEach(PeerRatios, SmallerFrame)}, {"GStreamer", ForEach(PeerRatios, StreamerSmallerFrame)}});
+		{{"libavutil", ForEach(PeerRatios, SmallerFrame)}, {"GStreamer", StreamerSmallerFrames()}});
 	Compare(kArea, "ratio of an older project mended", ForEach(Ratios, CorrectLegacyPixelAspectRatio));
 	Compare(kArea, "description", ForEach(Ratios, PixelAspectRatioDescription));
 	Compare(kArea, "description of a frame's size",

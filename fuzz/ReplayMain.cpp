@@ -32,7 +32,8 @@ std::string UnreachedChecks()
 {
 	std::string numbers;
 	for (std::size_t i = 0; i < zonfuzz::sReachedChecks.size(); ++i)
-		numbers += zonfuzz::sReachedChecks[i] ? "" : " " + std::to_string(i);
+		numbers.append(zonfuzz::sReachedChecks[i] ? "" : " ")
+			.append(zonfuzz::sReachedChecks[i] ? "" : std::to_string(i));
 	return numbers;
 }
 

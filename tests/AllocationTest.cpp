@@ -93,7 +93,10 @@ std::shared_ptr<const MessageCatalogue> LongCatalogue(const std::string& inKey)
 	keys.push_back(inKey);
 	zontest::Messages messages = {{"", "charset=UTF-8\n"}};
 	for (std::string& key : keys)
-		messages.emplace_back(key.replace(key.find('='), 1, "\4"), std::string(kMany, 'y') + "@0 \u00E9");
+	{
+		key[key.find('=')] = '\4';
+		messages.emplace_back(key, std::string(kMany, 'y') + "@0 \u00E9");
+	}
 	std::ranges::sort(messages);
 	MessageCatalogue catalogue;
 	std::string error;

@@ -56,7 +56,7 @@ inline Outcome Zonmedia(const std::vector<std::string>& inArguments, const std::
 	std::ofstream(kScratch + "input", std::ios::binary) << inInput;
 	std::string command = ShellQuoted(ZON_PROGRAM);
 	for (const std::string& argument : inArguments)
-		command += " " + ShellQuoted(argument);
+		command.append(" ").append(ShellQuoted(argument));
 	const int status
 		= std::system(("cd " + ShellQuoted(kScratch) + " && " + command + " <input >output 2>errors").c_str());
 	return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, FileText(kScratch + "output"), FileText(kScratch + "errors")};

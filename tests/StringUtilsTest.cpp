@@ -47,7 +47,7 @@ TEST(UTF8, EveryCodePointGoesBothWays)
 		const bool isSkipped = (point + 1) % 0x400 > 0x81 && point % step != 0;
 		if (isSkipped || (point >= 0xD800 && point <= 0xDFFF))
 			continue;
-		const std::string text = "a" + Encode(point, BytesOf(point));
+		const std::string text = std::string(1, 'a').append(Encode(point, BytesOf(point)));
 		const UTF16String wide = UTF8to16(text);
 		ASSERT_EQ(
 			wide, point < 0x10000 ? Units({'a', point}) : Units({'a', 0xD7C0 + (point >> 10), 0xDC00 + point % 0x400}));

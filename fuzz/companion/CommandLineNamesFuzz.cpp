@@ -115,7 +115,7 @@ void CheckFormats(FuzzInput& ioInput)
 		{
 			std::string names;
 			for (const PixelFormat format : inFormats)
-				names += (names.empty() ? "" : ",") + NameOf(format);
+				names.append(names.empty() ? "" : ",").append(NameOf(format));
 			Require(ReadPixelFormats(names) == inFormats, "formats are the list of their names");
 		});
 }

@@ -117,7 +117,7 @@ inline std::string LayoutText(const AudioChannelLayout& inLayout)
 {
 	std::string text;
 	for (const AudioChannelDescription channel : inLayout)
-		text += (text.empty() ? "" : " ") + LabelText(channel.mLabel);
+		text.append(text.empty() ? "" : " ").append(LabelText(channel.mLabel));   // g++ 12 warns of "+" here
 	return text.empty() ? "no channels" : text;
 }
 
