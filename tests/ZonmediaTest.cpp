@@ -4,7 +4,10 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <iterator>
 #include <nlohmann/json.hpp>
+#include <set>
+#include <sstream>
 #include <tuple>
 #include <utility>
 
@@ -68,6 +71,7 @@ TEST(Zonmedia, PrintsTheResultAlone)
 			{{"time", "01:00:00;00", "--rate", "29.97", "--to", "frames"}, "107892\n"},
 			{{"time", "107892", "--rate", "30000/1001", "--display", "frames", "--to", "29.97df"}, "01:00:00;00\n"},
 			{{"time", "62+08", "--rate", "24", "--display", "35mm", "--to", "24"}, "00:00:41:16\n"},
+			{{"time", "100", "--rate", "100", "--display", "frames", "--to", "auto"}, "100\n"},   // has no timecode
 			{{"time", "00:00:01:00", "--display", "25", "--to", "samples", "--to-rate", "48000Hz"}, "00:00:01:00000\n"},
 			// Values that begin as options do
 			{{"time", "-00:00:01:00", "--rate", "25", "--to", "ticks"}, "-254016000000\n"},
@@ -97,7 +101,9 @@ TEST(Zonmedia, PrintsTheResultAlone)
             0  L           1
             1  *           0
 )"},
-			{{"audio", "map", "51", "Stereo"},
+			{{"audio", "map", "5.1", "stereo"},
+				"5.1 (L, R, C, LFE, Ls, Rs) to Stereo\n  Is reordering  no: the layouts have 6 and 2 channels\n"},
+			{{"audio", "map", "5.1 (L, R, C, LFE, Ls, Rs)", "Stereo"},
 				"5.1 (L, R, C, LFE, Ls, Rs) to Stereo\n  Is reordering  no: the layouts have 6 and 2 channels\n"},
 			{{"audio", "map", "L,L", "L,C"},
 				"2 Channels (L L) to 2 Channels (L C)\n  Is reordering  no: the source has no C\n"},
@@ -184,6 +190,9 @@ TEST(Zonmedia, ComplainsInOneLine)
 			{{"time", "5", "6", "7", "--rate", "25"}, 2, "\"6\" is one argument too many"},
 			{{"time", "1", "--display", "tc"}, 2, "no display is named \"tc\"; there are 24, 25, "},
 			{{"tiem"}, 2, "no command is named \"tiem\"; the closest are time"},
+			{{"pixel", "--help"}, 2, "no command is named \"pixel\""},
+			{{"audio", "pixel", "--help"}, 2, "no command is named \"pixel\""},
+			{{"audio", "layout", "4 Channels"}, 2, "no layout is named"},   // there are several
 			{{"time"}, 2, "VALUE is required"},
 			{{"time", "1", "--display", "frames"}, 2, "the display frames has no rate of its own: --rate is required"},
 			{{"time", "1", "--to", "25"}, 2, "--rate is required, or a --display with a rate of its own"},
@@ -265,6 +274,59 @@ TEST(Zonmedia, HelpsWithExamples)
 	for (const char* const command : {"sheet", "time", "samples", "check", "keys"})
 		EXPECT_THAT(Zonmedia({command, "--help"}).mOutput, HasSubstr("Examples:\n  zonmedia " + std::string(command)));
 	EXPECT_THAT(Zonmedia({"--help"}).mOutput, HasSubstr("Exit status"));
+	EXPECT_THAT(Zonmedia({"time", "--help"}).mOutput, HasSubstr("one of: 24, 25, 29.97df,"));
+}
+
+std::size_t LongestLine(const std::string& inText)
+{
+	std::istringstream lines(inText);
+	std::size_t longest = 0;
+	for (std::string line; std::getline(lines, line);)
+		longest = std::max(longest, line.size());
+	return longest;
+}
+
+TEST(Zonmedia, KeepsToTheLine)
+{
+	for (const std::string command : {"", "sheet", "time", "samples", "pulldown", "audio", "video", "check", "keys",
+			 "audio layout", "audio matrix", "video cost", "video nearest", "video size", "video ratio"})
+	{
+		std::istringstream words(command);
+		std::vector<std::string> arguments(std::istream_iterator<std::string>(words), {});
+		arguments.emplace_back("--help");
+		EXPECT_LE(LongestLine(Zonmedia(arguments).mOutput), 80u) << command;
+	}
+	const std::vector<std::vector<std::string>> tables = {{"sheet", kClip}, {"video", "formats"}, {"check"},
+		{"audio", "matrix", "VST22_2", "VST22_2"}, {"samples", "1", "--rate", "48000", "--format", "samples"}};
+	for (const std::vector<std::string>& arguments : tables)
+	{
+		const std::string whole = Zonmedia(arguments).mOutput;   // for a file: rows as they are
+		ASSERT_EQ(setenv("COLUMNS", "80", 1), 0);
+		const std::string wrapped = Zonmedia(arguments).mOutput;
+		ASSERT_EQ(unsetenv("COLUMNS"), 0);
+		EXPECT_LE(LongestLine(wrapped), 80u) << wrapped;
+		const auto words = [](const std::string& inText)
+		{
+			std::istringstream stream(inText);
+			return std::set<std::string>(std::istream_iterator<std::string>(stream), {});
+		};
+		EXPECT_EQ(words(wrapped), words(whole));
+	}
+}
+
+TEST(Zonmedia, IsCompleted)
+{
+	const std::string program = ShellQuoted(ZON_PROGRAM);
+	for (const auto& [typed, offered] :
+		std::initializer_list<std::pair<std::string, std::string>>{{"ti", "time"}, {"audio m", "matrix map"},
+			{"--language p", "pt_BR"}, {"--language de ti", "time"}, {"time 5 --display 29", "29.97df 29.97ndf"},
+			{"samples 1 --format b", "beats bars"}, {"time --ra", "--rate"}})
+	{
+		const std::string script = "source " + ShellQuoted(ZON_COMPLETION) + "; COMP_WORDS=(" + program + " " + typed
+			+ "); COMP_CWORD=$((${#COMP_WORDS[@]} - 1)); _zonmedia; echo \"${COMPREPLY[*]}\" >" + kScratch + "offered";
+		ASSERT_EQ(std::system(("bash -c " + ShellQuoted(script)).c_str()), 0);
+		EXPECT_EQ(FileText(kScratch + "offered"), offered + "\n") << typed;
+	}
 }
 
 // ---- Sheets ----------------------------------------------------------------------------------------------------------

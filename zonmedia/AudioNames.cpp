@@ -3,6 +3,8 @@
 #include "zoncore/StringUtils.h"
 #include "zonmediatypes/Descriptions.h"
 
+#include <optional>
+
 namespace zonmedia
 {
 
@@ -65,6 +67,29 @@ bool IsAbbreviation(std::string_view inText)
 		LabelNames(), [inText](const auto& inNamed) { return IsSameName(inNamed.mName, inText); });
 }
 
+// Whether inShown is the description of a layout or what stands in it before the channels: "5.1 (L, R, C, LFE, Ls, Rs)".
+// Descriptions of many channels leave some out.
+bool IsDescription(std::string_view inText, std::string_view inShown)
+{
+	return (IsSameName(inText, inShown) && inShown.find("...") == std::string_view::npos)
+		|| IsSameName(inText, inShown.substr(0, inShown.find(" (")));
+}
+
+// The first layout that is described by inText, when all others that are have the same channels.
+std::optional<AudioChannelLayout> DescribedLayout(std::string_view inText)
+{
+	std::optional<AudioChannelLayout> described;
+	for (const auto& [name, layout] : LayoutNames())
+	{
+		if (!IsDescription(inText, zoncore::utility::UTF16to8(AudioChannelLayoutDescription(layout))))
+			continue;
+		if (described && !ContainsSameChannelsIgnoreOrder(*described, layout))
+			return std::nullopt;
+		described = described.value_or(layout);
+	}
+	return described;
+}
+
 }   // namespace
 
 std::span<const Named<AudioChannelLayout>> LayoutNames()
@@ -75,6 +100,8 @@ std::span<const Named<AudioChannelLayout>> LayoutNames()
 
 AudioChannelLayout ReadLayout(std::string_view inText)
 {
+	if (const auto described = DescribedLayout(inText))
+		return *described;
 	if (inText.find(',') != std::string_view::npos)
 		return ReadAbbreviations(ItemsOf(inText, ','));
 	// Marks within words belong to names of layouts: "L_ R_C" is L R C, not L Rc.

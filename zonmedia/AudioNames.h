@@ -16,7 +16,8 @@ namespace zonmedia
 /// The library's catalogue of layouts.
 std::span<const Named<zonmediatypes::AudioChannelLayout>> LayoutNames();
 
-/// Reads the name of a layout ("Broadcast51") or a list of abbreviations ("L,R,C,LFE,Ls,Rs", "L R"; "*" for a channel
+/// Reads the name of a layout ("Broadcast51"), its description as it is shown ("5.1 (L, R, C, LFE, Ls, Rs)" or "5.1" for
+/// short), or a list of abbreviations ("L,R,C,LFE,Ls,Rs", "L R"; "*" for a channel
 /// without a label). Throws UsageProblem with the closest names.
 zonmediatypes::AudioChannelLayout ReadLayout(std::string_view inText);
 

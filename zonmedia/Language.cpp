@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -47,12 +48,25 @@ std::vector<std::string> LanguagesIn(const fs::path& inFolder)
 	return languages;
 }
 
-// The languages that a locale's name stands for, the closest first: "de-AT.UTF-8" is "de_AT", else "de".
-std::vector<std::string> LanguagesOf(std::string_view inLocale)
+// The language of a locale without its country: "pt" of "pt_PT".
+std::string_view WithoutCountry(std::string_view inLanguage)
 {
-	std::string language(inLocale.substr(0, inLocale.find_first_of(".@")));
-	std::ranges::replace(language, '-', '_');
-	return {language, language.substr(0, language.find('_'))};
+	return inLanguage.substr(0, inLanguage.find('_'));
+}
+
+// The one of inPresent that is closest to a locale: "de-AT.UTF-8" is "de_AT", else "de", else German of any country.
+std::optional<std::string> ClosestLanguage(std::string_view inLocale, const std::vector<std::string>& inPresent)
+{
+	std::string wanted(inLocale.substr(0, inLocale.find_first_of(".@")));
+	std::ranges::replace(wanted, '-', '_');
+	const std::string_view any = WithoutCountry(wanted);
+	const auto find = [&](auto inIsMeant) { return std::ranges::find_if(inPresent, inIsMeant); };
+	auto found = find([&](const std::string& inName) { return IsSameName(inName, wanted); });
+	if (found == inPresent.end())
+		found = find([&](const std::string& inName) { return IsSameName(inName, any); });
+	if (found == inPresent.end())
+		found = find([&](const std::string& inName) { return IsSameName(WithoutCountry(inName), any); });
+	return found == inPresent.end() ? std::nullopt : std::optional(*found);
 }
 
 bool IsFile(std::string_view inLanguage)
@@ -67,17 +81,19 @@ fs::path FindCatalogue(std::string_view inLanguage)
 		return inLanguage;
 	const fs::path folder = CatalogueFolder();
 	const std::vector<std::string> present = LanguagesIn(folder);
-	for (const std::string& language : LanguagesOf(inLanguage))
-	{
-		const auto isMeant = [&](const std::string& inName) { return IsSameName(inName, language); };
-		if (const auto found = std::ranges::find_if(present, isMeant); found != present.end())
-			return *found == kEnglish ? fs::path() : CatalogueOf(folder, *found);
-	}
+	if (const auto found = ClosestLanguage(inLanguage, present))
+		return *found == kEnglish ? fs::path() : CatalogueOf(folder, *found);
 	throw InputProblem(
 		UnknownName("language", inLanguage, {present.begin(), present.end()}) + " (in " + folder.string() + ")");
 }
 
 }   // namespace
+
+std::string LanguageNames()
+{
+	const std::vector<std::string> names = LanguagesIn(CatalogueFolder());
+	return Joined(std::vector<std::string_view>(names.begin(), names.end()));
+}
 
 void UseLanguage(std::string_view inLanguage)
 {

@@ -3,11 +3,13 @@
 #include "zonmedia/Commands.h"
 #include "zonmedia/Language.h"
 #include "zonmedia/Names.h"
+#include "zonmedia/TextLines.h"
 #include "zonmediatypes/Version.h"
 
 #include <algorithm>
 #include <exception>
 #include <iostream>
+#include <sstream>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -19,8 +21,8 @@ using namespace zonmedia;   // NOLINT(google-build-using-namespace): this is its
 
 constexpr const char* kFooter = R"(Exit status:
   0  everything asked for was done
-  1  a file or a value could not be read, or a check failed; everything else was still done,
-     in English when it is the language that is missing or damaged
+  1  a file or a value could not be read, or a check failed; everything else
+     was still done, in English when it is the language that is missing
   2  the arguments make no command)";
 
 const std::string kValuesBehind = "--";
@@ -83,27 +85,54 @@ std::string Unexpected(const std::string& inExtra, const CLI::App& inLevel, bool
 		+ (inIsBehindMark ? " stands behind \"--\", where everything is a value" : " stands behind the command");
 }
 
-// The command line in the words of whoever typed it: what makes no command, or what the parser says.
-std::string Explanation(
-	const CLI::App& inApplication, const CLI::ParseError& inError, const std::vector<std::string>& inArguments)
+std::vector<std::string> Unused(const CLI::App& inApplication)
+{
+	std::vector<std::string> extras = inApplication.remaining(true);
+	std::erase(extras, kValuesBehind);
+	return extras;
+}
+
+const CLI::App& Innermost(const CLI::App& inApplication)
 {
 	const CLI::App* level = &inApplication;
 	while (!level->get_subcommands().empty())
 		level = level->get_subcommands().front();
-	const std::vector<std::string> extras = inApplication.remaining(true);
-	const auto extra = std::ranges::find_if(extras, [](const auto& inExtra) { return inExtra != kValuesBehind; });
-	if (extra != extras.end())
+	return *level;
+}
+
+// The command line in the words of whoever typed it: what makes no command, or what the parser says.
+std::string Explanation(
+	const CLI::App& inApplication, const CLI::ParseError& inError, const std::vector<std::string>& inArguments)
+{
+	const CLI::App& level = Innermost(inApplication);
+	if (const std::vector<std::string> extras = Unused(inApplication); !extras.empty())
 	{
 		const auto mark = std::ranges::find(inArguments, kValuesBehind);
-		return Unexpected(*extra, *level, std::find(mark, inArguments.end(), *extra) != inArguments.end());
+		const bool isBehindMark = std::find(mark, inArguments.end(), extras.front()) != inArguments.end();
+		return Unexpected(extras.front(), level, isBehindMark);
 	}
-	if (const std::vector<std::string> commands = CommandsOf(*level); !commands.empty())
+	if (const std::vector<std::string> commands = CommandsOf(level); !commands.empty())
 		return "a command is required: " + Joined(std::vector<std::string_view>(commands.begin(), commands.end()));
 	const std::string said = inError.what();
 	const std::size_t colon = std::min(said.find(": "), said.size());   // behind the option that is wrong
 	if (dynamic_cast<const CLI::ArgumentMismatch*>(&inError) != nullptr)
 		return said.substr(0, colon) + (said.ends_with("missing") ? " needs a value" : " is given more than once");
 	return dynamic_cast<const CLI::ValidationError*>(&inError) != nullptr ? std::string(said).erase(colon, 1) : said;
+}
+
+// Shows the help or the version that was asked for; there is none of a command that does not exist.
+void Grant(const CLI::App& inApplication, const CLI::Success& inWish)
+{
+	const std::vector<std::string> extras = Unused(inApplication);
+	const auto word
+		= std::ranges::find_if(extras, [](const std::string& inExtra) { return !inExtra.starts_with('-'); });
+	if (word != extras.end())
+		throw UsageProblem(Unexpected(*word, Innermost(inApplication), false) + " (see --help)");
+	std::ostringstream text;
+	inApplication.exit(inWish, text, text);
+	constexpr std::size_t kUsualWidth = 80;
+	const std::size_t width = LineWidth();
+	std::cout << WrappedHelp(text.str(), width == kAnyWidth ? kUsualWidth : width);
 }
 
 // Fine, or a complaint: the command runs all the same, in English.
@@ -130,7 +159,7 @@ Status RunCommandLine(const std::vector<std::string>& inArguments)
 	application.footer(kFooter);
 	application.set_version_flag("--version", zonmediatypes::Version());
 	application.add_option("--language", language,
-		"Describe values in a language, such as de or pt_BR, or from a message catalogue, such as ./de.mo");
+		"Language of the texts, one of: " + LanguageNames() + "; or a message catalogue, such as ./de.mo");
 	application.ignore_case();
 	application.fallthrough();   // --language may stand behind the command, too
 	application.require_subcommand(1);
@@ -149,7 +178,7 @@ Status RunCommandLine(const std::vector<std::string>& inArguments)
 	}
 	catch (const CLI::Success& wish)   // --help and --version
 	{
-		application.exit(wish);
+		Grant(application, wish);
 		return Status::Fine;
 	}
 	catch (const CLI::ParseError& error)

@@ -38,6 +38,16 @@ std::string UnknownName(std::string_view inWhat, std::string_view inText, std::v
 /// The names with commas between them.
 std::string Joined(std::span<const std::string_view> inNames);
 
+/// The names of all of inAll with commas between them, for a text of help.
+template <class T>
+std::string NamesOf(std::span<const Named<T>> inAll)
+{
+	std::vector<std::string_view> names;
+	for (const Named<T>& named : inAll)
+		names.emplace_back(named.mName);
+	return Joined(names);
+}
+
 /// The items of inText, which has inMark between them and may have one behind the last. Throws UsageProblem when one is
 /// empty.
 std::vector<std::string_view> ItemsOf(std::string_view inText, char inMark);

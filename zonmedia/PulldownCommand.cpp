@@ -72,7 +72,9 @@ void AddPulldownCommand(CLI::App& ioApplication, Run& outRun)
 	const auto arguments = std::make_shared<PulldownArguments>();
 	CLI::App& command = AddCommand(ioApplication, outRun, "pulldown",
 		"Show which video frames carry the film frames of a pulldown", kExamples, arguments, RunPulldown);
-	command.add_option("--cadence", arguments->mCadence, "Whole and split frames of a group: WSSWW, WWWSW ...")
+	command
+		.add_option("--cadence", arguments->mCadence,
+			"Whole (W) and split (S) frames of a group, one of: " + NamesOf<PulldownCadence>(sCadences))
 		->required();
 	command.add_option("--rate", arguments->mRate, "Rate of the video")->capture_default_str();
 	command.add_option("--groups", arguments->mGroups, "Groups of four film frames to show")

@@ -1,12 +1,12 @@
 #include "zonmedia/Report.h"
 
+#include "zonmedia/TextTable.h"
+
 #include <algorithm>
 #include <array>
 #include <charconv>
 #include <cstdlib>
 #include <iostream>
-#include <numeric>
-#include <span>
 #include <unistd.h>
 #include <utility>
 
@@ -24,98 +24,22 @@ std::string NumberText(Number inNumber)
 	return {text.data(), end};
 }
 
+constexpr std::size_t kLeastText = 20;   // columns that a text gets, however narrow the terminal is
+
 // ---- Text for people -------------------------------------------------------------------------------------------------
 
-constexpr std::string_view kBold = "\033[1m";
-constexpr std::string_view kDim = "\033[2m";
-constexpr std::string_view kPlain = "\033[0m";
-
-std::string Coloured(std::string_view inText, std::string_view inColour, Style inStyle)
+// A text that begins behind inIndent columns, in lines that do not reach beyond the terminal.
+void WriteText(std::string_view inText, std::size_t inIndent, Style inStyle)
 {
-	return inStyle.mHasColours ? std::string(inColour) + std::string(inText) + std::string(kPlain)
-							   : std::string(inText);
-}
-
-// The blocks of Unicode whose characters take two columns of a terminal.
-struct Range
-{
-	char32_t mFirst, mLast;
-};
-constexpr auto sWideBlocks = std::to_array<Range>({{0x1100, 0x115F}, {0x2E80, 0xA4CF}, {0xAC00, 0xD7A3},
-	{0xF900, 0xFAFF}, {0xFE30, 0xFE6F}, {0xFF00, 0xFF60}, {0xFFE0, 0xFFE6}, {0x20000, 0x3FFFD}});
-
-constexpr std::size_t Columns(char32_t inChar)
-{
-	const auto isIn = [inChar](Range inBlock) { return inChar >= inBlock.mFirst && inChar <= inBlock.mLast; };
-	return std::ranges::any_of(sWideBlocks, isIn) ? 2 : 1;
-}
-
-// The columns that UTF-8 text takes on a terminal.
-std::size_t Width(std::string_view inText)
-{
-	std::size_t width = 0;
-	for (std::size_t begin = 0; begin < inText.size();)
+	const std::size_t room
+		= inStyle.mLineWidth == kAnyWidth ? kAnyWidth : std::max(inStyle.mLineWidth, inIndent + kLeastText) - inIndent;
+	std::string_view indent;
+	const std::string blanks(inIndent, ' ');
+	for (const std::string& line : Wrapped(inText, room))
 	{
-		const auto isTail = [](char inByte) { return (static_cast<unsigned char>(inByte) & 0xC0) == 0x80; };
-		const auto next = std::ranges::find_if_not(inText.substr(begin + 1), isTail);
-		const std::string_view bytes(inText.begin() + static_cast<std::ptrdiff_t>(begin), next);
-		const unsigned lead = static_cast<unsigned char>(bytes.front());
-		char32_t code = bytes.size() == 1 ? lead : lead & (0x7Fu >> std::min<std::size_t>(bytes.size(), 7));
-		for (const char tail : bytes.substr(1))
-			code = code << 6 | (static_cast<unsigned char>(tail) & 0x3Fu);
-		width += Columns(code);
-		begin += bytes.size();
+		std::cout << indent << line << '\n';
+		indent = blanks;
 	}
-	return width;
-}
-
-std::string Padded(std::string_view inText, std::size_t inWidth, bool inToTheRight = false)
-{
-	const std::string blanks(inWidth - std::min(inWidth, Width(inText)), ' ');
-	return inToTheRight ? blanks + std::string(inText) : std::string(inText) + blanks;
-}
-
-constexpr std::string_view kIndent = "  ";
-constexpr std::string_view kGap = "  ";
-
-bool IsColumnOfNumbers(const Table& inTable, std::size_t inColumn)
-{
-	return std::ranges::all_of(inTable.mRows, [inColumn](const auto& inRow) { return inRow[inColumn].IsNumber(); });
-}
-
-std::size_t ColumnWidth(const Table& inTable, std::size_t inColumn)
-{
-	const auto widest = [inColumn](std::size_t inWidest, const auto& inRow)
-	{ return std::max(inWidest, Width(Printable(inRow[inColumn].mText))); };
-	return std::accumulate(inTable.mRows.begin(), inTable.mRows.end(), Width(inTable.mColumns[inColumn]), widest);
-}
-
-std::string WithoutBlanksAtTheEnd(std::string_view inLine)
-{
-	return std::string(inLine.substr(0, inLine.find_last_not_of(' ') + 1));
-}
-
-void WriteTable(const Table& inTable, Style inStyle)
-{
-	if (inTable.mRows.empty())
-		return;
-	std::string head;
-	std::vector<std::string> lines(inTable.mRows.size());
-	for (std::size_t column = 0; column < inTable.mColumns.size(); ++column)
-	{
-		const bool toTheRight = IsColumnOfNumbers(inTable, column);
-		const std::size_t width = ColumnWidth(inTable, column);
-		const std::string_view gap = column == 0 ? kIndent : kGap;
-		head.append(gap).append(Padded(inTable.mColumns[column], width, toTheRight));
-		for (std::size_t row = 0; row < lines.size(); ++row)
-			lines[row].append(gap).append(Padded(Printable(inTable.mRows[row][column].mText), width, toTheRight));
-	}
-	if (!inTable.mName.empty())
-		std::cout << '\n' << kIndent << Coloured(inTable.mName, kBold, inStyle) << '\n';
-	if (head.find_first_not_of(' ') != std::string::npos)
-		std::cout << Coloured(WithoutBlanksAtTheEnd(head), kDim, inStyle) << '\n';
-	for (const std::string& line : lines)
-		std::cout << WithoutBlanksAtTheEnd(line) << '\n';
 }
 
 // Writes the items of a record for people, one overload a kind.
@@ -127,12 +51,18 @@ struct ItemWriter
 	void operator()(const Field& inField) const
 	{
 		const std::string text = Printable(inField.mValue.mText);
-		if (!text.empty())
-			std::cout << kIndent << Coloured(Padded(inField.mName, mNameWidth), kDim, mStyle) << kGap << text << '\n';
+		if (text.empty())
+			return;
+		std::cout << kIndent << Coloured(Padded(inField.mName, mNameWidth), kDim, mStyle) << kGap;
+		WriteText(text, kIndent.size() + mNameWidth + kGap.size(), mStyle);
 	}
 	void operator()(const Table& inTable) const { WriteTable(inTable, mStyle); }
 	void operator()(const Grid& inGrid) const { WriteTable(inGrid.mTable, mStyle); }
-	void operator()(const Note& inNote) const { std::cout << '\n' << kIndent << Printable(inNote.mText) << '\n'; }
+	void operator()(const Note& inNote) const
+	{
+		std::cout << '\n' << kIndent;
+		WriteText(Printable(inNote.mText), kIndent.size(), mStyle);
+	}
 };
 
 // The widest name of those that people see.
@@ -232,7 +162,7 @@ Style StyleOfOutput(bool inIsJson)
 	const char* terminal = std::getenv("TERM");
 	const bool showsColours
 		= terminal != nullptr && std::string_view(terminal) != "dumb" && std::getenv("NO_COLOR") == nullptr;
-	return {inIsJson, showsColours && isatty(STDOUT_FILENO) == 1};
+	return {inIsJson, showsColours && isatty(STDOUT_FILENO) == 1, LineWidth()};
 }
 
 std::string JsonName(std::string_view inName)

@@ -5,7 +5,10 @@
 /// the same records, so that neither can show what the other lacks.
 
 #include "zonmedia/Problem.h"
+#include "zonmedia/TextLines.h"
 
+#include <cstddef>
+#include <cstdint>
 #include <nlohmann/json.hpp>
 #include <string>
 #include <string_view>
@@ -80,6 +83,7 @@ struct Style
 {
 	bool mIsJson = false;
 	bool mHasColours = false;   ///< standard output is a terminal that shows them
+	std::size_t mLineWidth = kAnyWidth;
 };
 
 /// The style for standard output as it is.

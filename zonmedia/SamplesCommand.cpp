@@ -218,13 +218,12 @@ void AddSamplesCommand(CLI::App& ioApplication, Run& outRun)
 	CLI::App& command = AddCommand(ioApplication, outRun, "samples",
 		"Convert a position on an audio tool's clock between samples, timecode, milliseconds, beats and bars",
 		kExamples, arguments, RunSamples);
+	const std::string formats = NamesOf<TimecodeFormat>(sFormats);
 	command.add_option("VALUE", arguments->mValue, kValueHelp)->required();
 	command.add_option("--rate", arguments->mRate, "Samples a second: 48000")->required();
-	command
-		.add_option(
-			"--format", arguments->mFormat, "How the value is written: samples, timecode, dropframe, bars, ms ...")
-		->required();
-	command.add_option("--to", arguments->mTo, "How it is to be written; default: in every format");
+	command.add_option("--format", arguments->mFormat, "How the value is written, one of: " + formats)->required();
+	command.add_option(
+		"--to", arguments->mTo, "How it is to be written, one of: " + formats + "; default: in every one");
 	command.add_option("--fps", arguments->mFramesPerSecond, "Frames a second, nominal: 30 for 29.97")
 		->check(NumberWhere<std::int32_t>([](std::int32_t inRate) { return inRate >= 1 && inRate <= 100'000; },
 			"nominal frame rate", "a whole number from 1 to 100000"))

@@ -110,11 +110,13 @@ void AddTimeCommand(CLI::App& ioApplication, Run& outRun)
 		"Convert a time between timecode, frames, film feet, samples, milliseconds and ticks", kExamples, arguments,
 		RunTime);
 	command.add_option("VALUE", arguments->mValue, kValueHelp)->required();
+	const std::string displays = NamesOf<TimeForm>(TimeForms());
 	command.add_option(
 		"--rate", arguments->mRate, "Rate of the media: 29.97, 30000/1001, 48000Hz; default: the display's own");
 	command.add_option("--display", arguments->mDisplay,
-		"How the time is written: 29.97df, frames, 35mm, samples, ms, ticks ...; default: as fits the rate");
-	command.add_option("--to", arguments->mTo, "How it is to be written; default: in every display");
+		"How the time is written, one of: " + displays + "; default: auto, as fits the rate");
+	command.add_option(
+		"--to", arguments->mTo, "How it is to be written, one of: " + displays + "; default: in every one");
 	command.add_option(
 		"--to-rate", arguments->mToRate, "Rate at which frames, feet and samples of the result count; default: --rate");
 }

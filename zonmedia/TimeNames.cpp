@@ -209,7 +209,7 @@ std::string NameOf(TimeForm inForm)
 TimeForm ChosenForm(TimeForm inForm, FrameRate inRate)
 {
 	return inForm.mDisplay == kTimeDisplay_Auto
-		? TimeForm{GetTimeDisplayForFrameRate(inRate, true, false, kTimeDisplay_2997DropTimecode, false)}
+		? TimeForm{GetTimeDisplayForFrameRate(inRate, true, false, kTimeDisplay_Frames, false)}
 		: inForm;
 }
 

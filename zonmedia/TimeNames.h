@@ -54,7 +54,7 @@ std::span<const Named<TimeForm>> TimeForms();
 /// The form of that name. Throws UsageProblem.
 TimeForm ReadTimeForm(std::string_view inName);
 std::string NameOf(TimeForm inForm);
-/// The form itself, or the one that "auto" stands for at inRate.
+/// The form itself, or the one that "auto" stands for at inRate: frames where the rate has no timecode.
 TimeForm ChosenForm(TimeForm inForm, zonmediatypes::FrameRate inRate);
 /// The library's description of the form, in the language of the run.
 std::string DescriptionOf(TimeForm inForm);

@@ -243,7 +243,7 @@ Status RunRatio(const SizeArguments& inArguments)
 
 constexpr const char* kFormatHelp = "A name of the catalogue (BGRA_4444_8u), a code (bgra) or any";
 constexpr const char* kFormatsHelp = "Names or codes with commas between them";
-constexpr const char* kQualityHelp = "draft, low, medium, high or max";
+constexpr const char* kQualityHelp = "Quality of the conversion, one of: draft, low, medium, high, max";
 
 void AddCostCommand(CLI::App& ioVideo, Run& outRun)
 {

@@ -3,17 +3,23 @@
 _zonmedia()
 {
 	local program=${COMP_WORDS[0]} current=${COMP_WORDS[COMP_CWORD]} word
+	local previous=${COMP_WORDS[COMP_CWORD-1]}
 	local -a command=() words=("${COMP_WORDS[@]:1:COMP_CWORD-1}")
-	[[ ${words[0]-} != --language ]] || words=("${words[@]:2}")
+	if [[ ${words[0]-} == --language ]]; then
+		words=("${words[@]:2}")
+	fi
 	for word in "${words[@]}"; do
 		[[ $word =~ ^[a-z]+$ ]] || break
 		command+=("$word")
 		((${#command[@]} < 2)) || break
 	done
 
-	local help names
-	help=$("$program" "${command[@]}" --help 2>/dev/null) || return
-	if [[ $current == -* ]]; then
+	local help names values
+	[[ $previous != --language ]] || command=()
+	help=$(COLUMNS=10000 "$program" "${command[@]}" --help 2>/dev/null) || return
+	if [[ $previous == --* ]] && values=$(sed -n "s/^  $previous .*one of: \([^;]*\).*/\1/p" <<<"$help") && [[ $values ]]; then
+		names=${values//, / }
+	elif [[ $current == -* ]]; then
 		names=$(sed -n 's/^  \(-[^ ]*\).*/\1/p' <<<"$help" | tr ',' '\n')
 	else
 		names=$(sed -n '/^Subcommands:/,/^$/s/^  \([a-z][a-z-]*\) .*/\1/p' <<<"$help")
