@@ -31,6 +31,21 @@ std::string CataloguePath(const std::string& inLanguage)
 	return ZON_CATALOGUES "/" + inLanguage + "/LC_MESSAGES/zonmediatypes.mo";
 }
 
+// The keys of the library and of the companion, as the template has them; no text has a quotation mark.
+std::vector<std::string> TemplateKeys()
+{
+	const std::string text = FileText(ZON_TRANSLATIONS "/zonmediatypes.pot");
+	const auto quoted = [&](std::string_view inName, std::size_t inAt)
+	{
+		const std::size_t begin = text.find(inName, inAt) + inName.size();
+		return text.substr(begin, text.find('"', begin) - begin);
+	};
+	std::vector<std::string> keys;
+	for (std::size_t at = text.find("msgctxt"); at != std::string::npos; at = text.find("msgctxt", at + 1))
+		keys.push_back(quoted("msgctxt \"", at) + '=' + quoted("msgid \"", at));
+	return keys;
+}
+
 // What no language changes: the digits of rates, sizes and standards, and the placeholders.
 std::multiset<std::string> Kept(std::string_view inText)
 {
@@ -71,8 +86,10 @@ INSTANTIATE_TEST_SUITE_P(
 
 TEST_P(Translation, HasEachKeyAndKeepsPlaceholdersAndNumbers)
 {
-	EXPECT_EQ(mCatalogue->GetSize(), AllTextKeys().size());
-	for (const std::string_view key : AllTextKeys())
+	const std::vector<std::string> keys = TemplateKeys();
+	EXPECT_TRUE(std::ranges::equal(AllTextKeys(), std::span(keys).first(AllTextKeys().size())));
+	EXPECT_EQ(mCatalogue->GetSize(), keys.size());
+	for (const std::string_view key : keys)
 	{
 		const std::string text(mCatalogue->Find(key));
 		EXPECT_NE(text, "") << key;
@@ -144,7 +161,7 @@ TEST(Translations, AreExplainedAndHaveACurrentTemplate)
 			EXPECT_EQ(text.compare(line, 3, "#. "), 0) << entry.path() << text.substr(at, 80);
 			++messages;
 		}
-		EXPECT_EQ(messages, AllTextKeys().size()) << entry.path();
+		EXPECT_EQ(messages, TemplateKeys().size()) << entry.path();
 	}
 }
 
@@ -170,6 +187,38 @@ TEST(Translations, ReachTheCompanion)
 	}
 	EXPECT_EQ(Zonmedia({"time", "1", "--rate", "25", "--display", "frames", "--language", "de"}).mOutput,
 		DisplaysIn("de").mOutput);
+}
+
+// Rows, columns and texts of the companion are in the language, all numbers have its decimal sign, and what programs read is
+// the same in all.
+TEST(Translations, AreOfOnePieceOnASheet)
+{
+	const std::vector<std::vector<std::string>> commands = {{"sheet", ZON_CLIP},
+		{"time", "1", "--rate", "2997/100", "--display", "frames"}, {"audio", "matrix", "51", "Stereo"},
+		{"audio", "layout", "51"}, {"video", "formats"}, {"video", "ratio", "10/11", "720x480"},
+		{"video", "cost", "bgra", "v210"}, {"samples", "1", "--rate", "48000", "--format", "samples"},
+		{"pulldown", "--cadence", "WSSWW"}, {"check"}, {"audio", "map", "51", "Stereo"}};
+	for (std::vector<std::string> command : commands)
+	{
+		const std::string english = Zonmedia(command).mOutput;
+		command.insert(command.begin(), {"--language", "de"});
+		const std::string german = Zonmedia(command).mOutput;
+		EXPECT_NE(german, english) << command[2];
+		for (const char* const word : {"Description", "Frame duration", "Pixel shape", "Video codec", "unknown", " yes",
+				 "last frame", "Depth", "Left right", "Is possible", "Film frame"})
+			EXPECT_THAT(german, testing::Not(HasSubstr(word))) << command[2];
+		command.emplace_back("--json");
+		const std::string inGerman = Zonmedia(command).mOutput;
+		command.erase(command.begin(), command.begin() + 2);
+		EXPECT_EQ(inGerman, Zonmedia(command).mOutput);
+	}
+	const Outcome sheet = Zonmedia({"--language", "de", "sheet", ZON_CLIP});
+	for (const char* const text :
+		{"Framegröße", "(29,97 fps)", "48000 Hz", "(0,9091)", "letzter Frame", "00:00:05,005", "Ticks"})
+		EXPECT_THAT(sheet.mOutput, HasSubstr(text));
+	EXPECT_THAT(sheet.mOutput, testing::Not(testing::ContainsRegex("[0-9]\\.[0-9]+ fps|0\\.9091|5\\.005")));
+	EXPECT_EQ(
+		Zonmedia({"time", "00:00:05,005", "--rate", "25", "--display", "ms", "--to", "ms"}).mOutput, "00:00:05.005\n");
 }
 
 TEST(Translations, LeaveEnglishWhenTheyCannotBeRead)

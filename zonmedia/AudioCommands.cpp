@@ -1,6 +1,7 @@
 #include "zoncore/StringUtils.h"
 #include "zonmedia/AudioNames.h"
 #include "zonmedia/Commands.h"
+#include "zonmedia/Texts.h"
 #include "zonmediatypes/Descriptions.h"
 
 #include <algorithm>
@@ -94,7 +95,7 @@ std::string GainText(double inGain)
 		return ".";
 	std::array<char, 32> text{};
 	const auto end = std::to_chars(text.data(), text.data() + text.size(), inGain, std::chars_format::general, 4).ptr;
-	return {text.data(), end};
+	return WithDecimalSign({text.data(), end});
 }
 
 Grid MatrixGrid(
@@ -140,7 +141,7 @@ Value Untaken(const AudioChannelLayout& inFrom, const ChannelConversionMatrix& i
 Record ConversionRecord(const AudioChannelLayout& inFrom, const AudioChannelLayout& inTo)
 {
 	Record record{{"From", Description(inFrom)}, {}};
-	record.mSubject.mValue = {Description(inFrom) + " to " + Description(inTo), Description(inFrom)};
+	record.mSubject.mValue = {Say(kText_FromTo, {Description(inFrom), Description(inTo)}), Description(inFrom)};
 	record.mItems = {
 		Field{"To", {"", Description(inTo)}},
 		Field{"Source channels", {"", ChannelsOf(inFrom).mJson}},
@@ -159,7 +160,7 @@ Status RunMatrix(const ConversionArguments& inArguments)
 	record.mItems.emplace_back(MatrixGrid(from, to, matrix));
 	const Value untaken = Untaken(from, matrix);
 	if (!untaken.mText.empty())
-		record.mItems.emplace_back(Note{"No channel takes " + untaken.mText});
+		record.mItems.emplace_back(Note{Say(kText_Untaken, {untaken.mText})});
 	record.mItems.emplace_back(Field{"Untaken", {"", untaken.mJson}});
 	Print(record, inArguments.GetStyle());
 	return Status::Fine;
@@ -170,13 +171,12 @@ Status RunMatrix(const ConversionArguments& inArguments)
 std::string WhyNoReordering(const AudioChannelLayout& inFrom, const AudioChannelLayout& inTo)
 {
 	if (inFrom.size() != inTo.size())
-		return "the layouts have " + std::to_string(inFrom.size()) + " and " + std::to_string(inTo.size())
-			+ " channels";
+		return Say(kText_ChannelCounts, {std::to_string(inFrom.size()), std::to_string(inTo.size())});
 	const auto isMissing
 		= [&](AudioChannelDescription inChannel) { return !HasChannelLabel(inFrom, inChannel.mLabel); };
 	const auto missing = std::ranges::find_if(inTo, isMissing);
-	return missing != inTo.end() ? "the source has no " + Abbreviation(missing->mLabel)
-								 : "the source has fewer channels without a label";
+	return missing != inTo.end() ? Say(kText_MissingChannel, {Abbreviation(missing->mLabel)})
+								 : Say(kText_FewerUnlabelled);
 }
 
 Status RunMap(const ConversionArguments& inArguments)
@@ -187,7 +187,7 @@ Status RunMap(const ConversionArguments& inArguments)
 	const bool isReordering = RemapChannelOrdering(from, to, ordering);
 	Record record = ConversionRecord(from, to);
 	record.mItems.emplace_back(
-		Field{"Is reordering", {isReordering ? "" : "no: " + WhyNoReordering(from, to), isReordering}});
+		Field{"Is reordering", {isReordering ? "" : Say(kText_NoBecause, {WhyNoReordering(from, to)}), isReordering}});
 	Table table{"Ordering", {"Destination", "Label", "Source"}, {}};
 	for (std::size_t channel = 0; channel < ordering.size(); ++channel)
 		table.mRows.push_back({static_cast<std::int64_t>(channel), Abbreviation(to[channel].mLabel),

@@ -1,7 +1,9 @@
 #include "zonmedia/Commands.h"
+#include "zonmedia/Texts.h"
 #include "zonmedia/TranslationTemplate.h"
 #include "zonmediatypes/Descriptions.h"
 
+#include <algorithm>
 #include <iostream>
 #include <string_view>
 
@@ -24,11 +26,14 @@ Status RunKeys(const KeysArguments& inArguments)
 		return Status::Fine;
 	}
 	Table table{"Keys", {"Path", "Text"}, {}};
-	for (const std::string_view text : zonmediatypes::AllTextKeys())
+	const auto add = [&](std::string_view inText)
 	{
-		const TextKey key(text);
+		const TextKey key(inText);
 		table.mRows.push_back({std::string(key.mPath), std::string(key.mText)});
-	}
+	};
+	std::ranges::for_each(zonmediatypes::AllTextKeys(), add);
+	for (const auto& [text, note] : AllOwnTexts())
+		add(text);
 	Print({{"Count", {"", static_cast<std::int64_t>(table.mRows.size())}}, {std::move(table)}}, inArguments.GetStyle());
 	return Status::Fine;
 }
@@ -38,7 +43,7 @@ Status RunKeys(const KeysArguments& inArguments)
 void AddKeysCommand(CLI::App& ioApplication, Run& outRun)
 {
 	const auto arguments = std::make_shared<KeysArguments>();
-	AddCommand(ioApplication, outRun, "keys", "List the keys and English texts that the library looks up",
+	AddCommand(ioApplication, outRun, "keys", "List the keys and English texts of the library and the companion",
 		"  zonmedia keys\n  zonmedia keys --pot > zonmediatypes.pot", arguments, RunKeys)
 		.add_flag("--pot", arguments->mIsTemplate, "Write a gettext template for translators")
 		->excludes("--json");

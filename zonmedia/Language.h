@@ -1,7 +1,7 @@
 #pragma once
 
 /// \file
-/// The language of the texts that the library gives. The companion's own words stay English.
+/// The language of the texts that the library gives, and of the companion's own.
 
 #include <string>
 #include <string_view>

@@ -1,5 +1,6 @@
 // The command-line companion of the library: shows what the library makes of media files, times, channels and formats.
 
+#include "zoncore/Localizer.h"
 #include "zonmedia/Commands.h"
 #include "zonmedia/Language.h"
 #include "zonmedia/Names.h"
@@ -135,6 +136,13 @@ void Grant(const CLI::App& inApplication, const CLI::Success& inWish)
 	std::cout << WrappedHelp(text.str(), width == kAnyWidth ? kUsualWidth : width);
 }
 
+// Programs get the same of every language.
+bool IsForPrograms(const CLI::App& inApplication)
+{
+	const CLI::Option* option = Innermost(inApplication).get_option_no_throw("--json");
+	return option != nullptr && option->count() > 0;
+}
+
 // Fine, or a complaint: the command runs all the same, in English.
 Status ChooseLanguage(const std::string& inLanguage)
 {
@@ -186,6 +194,8 @@ Status RunCommandLine(const std::vector<std::string>& inArguments)
 		throw UsageProblem(Explanation(application, error, inArguments) + " (see --help)");
 	}
 	const Status status = ChooseLanguage(language);
+	if (IsForPrograms(application))
+		zoncore::config::Localizer::Get().SetCatalogue(nullptr);
 	return std::max(status, run());
 }
 

@@ -1,6 +1,7 @@
 #include "zonmedia/Report.h"
 
 #include "zonmedia/TextTable.h"
+#include "zonmedia/Texts.h"
 
 #include <algorithm>
 #include <array>
@@ -53,7 +54,7 @@ struct ItemWriter
 		const std::string text = Printable(inField.mValue.mText);
 		if (text.empty())
 			return;
-		std::cout << kIndent << Coloured(Padded(inField.mName, mNameWidth), kDim, mStyle) << kGap;
+		std::cout << kIndent << Coloured(Padded(NameInLanguage(inField.mName), mNameWidth), kDim, mStyle) << kGap;
 		WriteText(text, kIndent.size() + mNameWidth + kGap.size(), mStyle);
 	}
 	void operator()(const Table& inTable) const { WriteTable(inTable, mStyle); }
@@ -73,7 +74,7 @@ std::size_t FieldNameWidth(const Record& inRecord)
 	{
 		const auto* field = std::get_if<Field>(&item);
 		if (field != nullptr && !field->mValue.mText.empty())
-			width = std::max(width, Width(field->mName));
+			width = std::max(width, Width(NameInLanguage(field->mName)));
 	}
 	return width;
 }
@@ -138,7 +139,7 @@ Value::Value(std::string inText) : mText(std::move(inText)), mJson(mText)
 Value::Value(const char* inText) : Value(std::string(inText))
 {
 }
-Value::Value(bool inAnswer) : mText(inAnswer ? "yes" : "no"), mJson(inAnswer)
+Value::Value(bool inAnswer) : mText(Say(inAnswer ? kText_Yes : kText_No)), mJson(inAnswer)
 {
 }
 Value::Value(int inNumber) : Value(std::int64_t{inNumber})
@@ -150,7 +151,7 @@ Value::Value(std::int64_t inNumber) : mText(NumberText(inNumber)), mJson(inNumbe
 Value::Value(std::uint64_t inNumber) : mText(NumberText(inNumber)), mJson(inNumber)
 {
 }
-Value::Value(double inNumber) : mText(NumberText(inNumber)), mJson(inNumber)
+Value::Value(double inNumber) : mText(WithDecimalSign(NumberText(inNumber))), mJson(inNumber)
 {
 }
 Value::Value(std::string inText, Json inJson) : mText(std::move(inText)), mJson(std::move(inJson))

@@ -40,7 +40,8 @@ struct Value
 	Json mJson;
 };
 
-/// A value with its name. The name is written as people read it ("Frame size"); JSON's is made from it ("frameSize").
+/// A value with its name. The name is written as people read it in English ("Frame size"): JSON's is made from it
+/// ("frameSize"), and people see it in the language of the run (see Texts.h).
 struct Field
 {
 	std::string mName;

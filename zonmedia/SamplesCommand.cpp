@@ -1,6 +1,7 @@
 #include "zoncore/StringUtils.h"
 #include "zonmedia/Commands.h"
 #include "zonmedia/Input.h"
+#include "zonmedia/Texts.h"
 #include "zonmedia/TimeNames.h"
 #include "zonmediatypes/TimeConversionUtils.h"
 
@@ -170,7 +171,8 @@ Record MakeRecord(const std::string& inText, std::int64_t inSamples, TimecodeFor
 {
 	Record record{{"Value", inText}, {}};
 	record.mItems = {
-		Field{"Sample rate", {std::to_string(inClock.mSampleRate) + "Hz", std::int64_t{inClock.mSampleRate}}},
+		Field{"Sample rate",
+			{Say(kText_SampleRate, {std::to_string(inClock.mSampleRate)}), std::int64_t{inClock.mSampleRate}}},
 		Field{"Frames per second", inClock.mFramesPerSecond},
 		Field{"Format", NameOf<TimecodeFormat>(sFormats, inFormat)},
 		Field{"Samples", inSamples},

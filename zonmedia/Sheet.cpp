@@ -1,6 +1,7 @@
 #include "zonmedia/Sheet.h"
 
 #include "zoncore/StringUtils.h"
+#include "zonmedia/Texts.h"
 #include "zonmedia/TimeNames.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelFormatUtils.h"
@@ -22,23 +23,26 @@ using zoncore::utility::UTF16to8;
 namespace
 {
 
-const Value kUnknown{"unknown", nullptr};
-constexpr const char* kUncounted = " (not counted; --scan does)";
+Value Unknown()
+{
+	return {Say(kText_Unknown), nullptr};
+}
 
 // ---- Times -----------------------------------------------------------------------------------------------------------
 
 // The frames of a file's picture, or the samples of its sound, as a span of time.
 struct Span
 {
-	const char* mUnit;   // what is counted
-	const char* mUnits;
+	const char* mLastName;   // of the row of the last of them
+	const char* mUnits;      // of the row that counts them
+	const OwnText* mEndText;
 	Rate mRate;
 	TimeForm mForm;
 	TickTime mStart;
 	std::optional<std::int64_t> mCount;
 	std::optional<TickTime> mDuration;   // nothing when it is unknown or outlasts what ticks can count
 	bool mIsSteady = true;               // what is counted is all of one length
-	const char* mCountNote = "";         // behind the count, for people
+	bool mIsCounted = true;              // else it is worked out
 };
 
 // inCount frames or samples at a steady rate.
@@ -74,8 +78,8 @@ std::optional<Span> PictureSpan(const MediaFile& inFile)
 	const TickTime start = TaggedStart(tag, rate->mRate, form).value_or(kTime_Zero);
 	const VideoLength& length = inFile.mVideo->mLength;
 	const auto duration = length.mVariation ? length.mDuration : SteadyDuration(length.mFrameCount, rate->mRate);
-	return Span{"frame", "Frames", *rate, form, start, length.mFrameCount, duration, !length.mVariation,
-		length.mIsByDuration ? kUncounted : ""};
+	return Span{"Last frame", "Frames", &kText_LastFrame, *rate, form, start, length.mFrameCount, duration,
+		!length.mVariation, !length.mIsByDuration};
 }
 
 std::optional<Span> SoundSpan(const MediaFile& inFile)
@@ -87,16 +91,16 @@ std::optional<Span> SoundSpan(const MediaFile& inFile)
 	TickTime start;
 	start.AddFrames(inFile.mStartSample.value_or(0), rate->mRate);
 	const std::optional<std::int64_t> count = inFile.mAudio.front().mSampleCount;
-	return Span{
-		"sample", "Samples", *rate, {kTimeDisplay_AudioSamples}, start, count, SteadyDuration(count, rate->mRate)};
+	return Span{"Last sample", "Samples", &kText_LastSample, *rate, {kTimeDisplay_AudioSamples}, start, count,
+		SteadyDuration(count, rate->mRate)};
 }
 
 void AddRate(Record& ioSheet, const Rate& inRate)
 {
 	const std::int64_t ticks = inRate.mRate.GetTicksPerFrame();
-	const std::string rounding = inRate.mIsRounded ? ", rounded: at this rate it is no whole number of ticks" : "";
+	const OwnText& text = inRate.mIsRounded ? kText_RoundedTickCount : kText_TickCount;
 	ioSheet.Add("Rate", {Text(inRate), Text(inRate.mStated)});
-	ioSheet.Add("Frame duration", {std::to_string(ticks) + " ticks" + rounding, ticks});
+	ioSheet.Add("Frame duration", {Say(text, {std::to_string(ticks)}), ticks});
 	ioSheet.Add("Rate is rounded", {"", inRate.mIsRounded});
 }
 
@@ -104,19 +108,18 @@ void AddRate(Record& ioSheet, const Rate& inRate)
 void AddEnd(Record& ioSheet, const Span& inSpan, std::optional<TickTime> inEnd)
 {
 	const FrameRate rate = inSpan.mRate.mRate;
-	const std::string lastName = std::string("Last ") + inSpan.mUnit;
-	const Value end = inEnd ? TimeValue(*inEnd, rate, inSpan.mForm) : kUnknown;
+	const Value end = inEnd ? TimeValue(*inEnd, rate, inSpan.mForm) : Unknown();
 	if (!inEnd || !inSpan.mIsSteady)
 	{
 		ioSheet.Add("End", end);
-		ioSheet.Add(lastName, {"", nullptr});
+		ioSheet.Add(inSpan.mLastName, {"", nullptr});
 		return;
 	}
 	const std::string last = TimeText(*inEnd, rate, inSpan.mForm, kTimecodeFlag_LastFrame);
 	TickTime lastTime = *inEnd;
 	lastTime.AddFrames(-1, rate);
-	ioSheet.Add("End", {end.mText + " (last " + inSpan.mUnit + " " + last + ")", end.mJson});
-	ioSheet.Add(lastName, {"", Json{{"text", last}, {"ticks", lastTime.GetTicks()}}});
+	ioSheet.Add("End", {Say(*inSpan.mEndText, {end.mText, last}), end.mJson});
+	ioSheet.Add(inSpan.mLastName, {"", Json{{"text", last}, {"ticks", lastTime.GetTicks()}}});
 }
 
 void AddTimes(Record& ioSheet, const Span& inSpan)
@@ -126,20 +129,21 @@ void AddTimes(Record& ioSheet, const Span& inSpan)
 	ioSheet.Add("Display", {DescriptionOf(inSpan.mForm), NameOf(inSpan.mForm)});
 	ioSheet.Add("Start", TimeValue(inSpan.mStart, rate, inSpan.mForm));
 	AddEnd(ioSheet, inSpan, duration ? std::optional(inSpan.mStart + *duration) : std::nullopt);
-	ioSheet.Add("Duration", duration ? TimeValue(*duration, rate, inSpan.mForm) : kUnknown);
+	ioSheet.Add("Duration", duration ? TimeValue(*duration, rate, inSpan.mForm) : Unknown());
 	const bool isCounted = inSpan.mCount && (duration || !inSpan.mIsSteady);
-	const Value count = isCounted ? Value(*inSpan.mCount) : kUnknown;
-	ioSheet.Add(inSpan.mUnits, {count.mText + inSpan.mCountNote, count.mJson});
+	const Value count = isCounted ? Value(*inSpan.mCount) : Unknown();
+	ioSheet.Add(inSpan.mUnits, inSpan.mIsCounted ? count : Value(Say(kText_NotCounted, {count.mText}), count.mJson));
 }
 
 // ---- What a scan finds -----------------------------------------------------------------------------------------------
 
-// A rate to two decimals, without zeros at the end.
+// A frame rate to two decimals, without zeros at the end.
 std::string RateText(double inRate)
 {
 	std::array<char, 32> text{};
 	const auto hundredths = std::round(inRate * 100.0) / 100.0;
-	return {text.data(), std::to_chars(text.data(), text.data() + text.size(), hundredths).ptr};
+	const char* const end = std::to_chars(text.data(), text.data() + text.size(), hundredths).ptr;
+	return Say(kText_FrameRate, {WithDecimalSign({text.data(), end})});
 }
 
 Value VariationValue(const std::optional<RateVariation>& inVariation)
@@ -148,9 +152,10 @@ Value VariationValue(const std::optional<RateVariation>& inVariation)
 		return {"", nullptr};
 	const auto& [average, lowest, highest] = *inVariation;
 	const auto json = [](std::optional<double> inRate) { return inRate ? Json(*inRate) : Json(nullptr); };
-	std::string text = RateText(average) + "fps on average";
-	if (lowest && highest)
-		text += ", " + RateText(*lowest) + "fps to " + RateText(*highest) + "fps";
+	const bool hasRange = lowest && highest;
+	const std::string text = hasRange
+		? Say(kText_AverageAndRange, {RateText(average), RateText(*lowest), RateText(*highest)})
+		: Say(kText_Average, {RateText(average)});
 	return {text, Json{{"average", average}, {"lowest", json(lowest)}, {"highest", json(highest)}}};
 }
 
@@ -158,8 +163,8 @@ Value MissingValue(const VideoLength& inLength)
 {
 	if (!inLength.mStatedCount || !inLength.mFrameCount)
 		return {"", nullptr};
-	const std::string text = "truncated: " + std::to_string(*inLength.mFrameCount) + " of "
-		+ std::to_string(*inLength.mStatedCount) + " frames are there";
+	const std::string text
+		= Say(kText_Truncated, {std::to_string(*inLength.mFrameCount), std::to_string(*inLength.mStatedCount)});
 	return {text, Json{{"present", *inLength.mFrameCount}, {"stated", *inLength.mStatedCount}}};
 }
 
@@ -170,14 +175,14 @@ Value TimecodeTagValue(const std::string& inTag, const std::optional<Span>& inSp
 	if (inTag.empty())
 		return {"", nullptr};
 	const bool isRead = inSpan && TaggedStart(inTag, inSpan->mRate.mRate, inSpan->mForm);
-	return {inTag + (isRead ? "" : " (no timecode: the start is taken as 0)"), inTag};
+	return {isRead ? inTag : Say(kText_NoTimecode, {inTag}), inTag};
 }
 
 Value PixelShapeValue(PixelAspectRatio inShape)
 {
 	if (inShape == kPixelAspectRatio_Unknown)
-		return kUnknown;
-	const std::string text = UTF16to8(PixelAspectRatioDescription(inShape));
+		return Unknown();
+	const std::string text = WithDecimalSign(UTF16to8(PixelAspectRatioDescription(inShape)));
 	return {
 		text, Json{{"text", text}, {"numerator", inShape.GetNumerator()}, {"denominator", inShape.GetDenominator()}}};
 }
@@ -185,7 +190,7 @@ Value PixelShapeValue(PixelAspectRatio inShape)
 Value PixelFormatValue(const VideoStream& inVideo)
 {
 	if (inVideo.mPixelFormat == kPixelFormat_Invalid)
-		return {"none: the library has no counterpart of " + inVideo.mCodec + " " + inVideo.mStoredFormat, nullptr};
+		return {Say(kText_NoCounterpart, {inVideo.mCodec, inVideo.mStoredFormat}), nullptr};
 	const std::string name(PixelFormatCatalogueName(inVideo.mPixelFormat));
 	const std::string text = UTF16to8(PixelFormatDescription(inVideo.mPixelFormat));
 	return {text + " (" + name + ")", Json{{"text", text}, {"name", name}}};
@@ -195,7 +200,8 @@ void AddPicture(Record& ioSheet, const VideoStream& inVideo, bool inIsStill)
 {
 	const int width = inVideo.mWidth;
 	const int height = inVideo.mHeight;
-	const std::string size = UTF16to8(VideoFrameSizeDescription({0, 0, width, height}, inVideo.mPixelShape));
+	const std::string size
+		= WithDecimalSign(UTF16to8(VideoFrameSizeDescription({0, 0, width, height}, inVideo.mPixelShape)));
 	ioSheet.Add(inIsStill ? "Image codec" : "Video codec", inVideo.mCodec);
 	ioSheet.Add(
 		inIsStill ? "Image size" : "Frame size", {size, Json{{"text", size}, {"width", width}, {"height", height}}});
@@ -223,7 +229,7 @@ Table AudioTable(const MediaFile& inFile)
 	{
 		const auto number = static_cast<std::int64_t>(table.mRows.size()) + 1;
 		const auto channels = static_cast<std::int64_t>(stream.mLayout.size());
-		const Value rate{std::to_string(stream.mSampleRate) + "Hz", stream.mSampleRate};
+		const Value rate{Say(kText_SampleRate, {std::to_string(stream.mSampleRate)}), stream.mSampleRate};
 		table.mRows.push_back(
 			{number, stream.mCodec, rate, channels, UTF16to8(AudioChannelLayoutDescription(stream.mLayout))});
 	}
@@ -245,7 +251,7 @@ void AddVideo(Record& ioSheet, const MediaFile& inFile)
 	const VideoLength& length = inFile.mVideo->mLength;
 	ioSheet.Add("Timecode tag", TimecodeTagValue(inFile.mStartTimecode, picture));
 	if (!picture)
-		ioSheet.Add("Rate", kUnknown);
+		ioSheet.Add("Rate", Unknown());
 	if (picture)
 		AddRate(ioSheet, picture->mRate);
 	ioSheet.Add("Variable frame rate", VariationValue(length.mVariation));
@@ -264,7 +270,7 @@ void AddSound(Record& ioSheet, const MediaFile& inFile)
 	const std::optional<Span> sound = SoundSpan(inFile);
 	ioSheet.Add("Timecode tag", TimecodeTagValue(inFile.mStartTimecode, std::nullopt));
 	if (!sound)
-		ioSheet.Add("Rate", kUnknown);
+		ioSheet.Add("Rate", Unknown());
 	if (sound)
 	{
 		AddRate(ioSheet, sound->mRate);

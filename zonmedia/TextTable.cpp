@@ -1,6 +1,7 @@
 #include "zonmedia/TextTable.h"
 
 #include "zonmedia/TextLines.h"
+#include "zonmedia/Texts.h"
 
 #include <algorithm>
 #include <iostream>
@@ -26,7 +27,9 @@ struct Cells
 
 Cells CellsOf(const Table& inTable)
 {
-	Cells cells{inTable.mColumns, {}, std::vector<bool>(inTable.mColumns.size(), true)};
+	Cells cells{{}, {}, std::vector<bool>(inTable.mColumns.size(), true)};
+	for (const std::string& column : inTable.mColumns)
+		cells.mHead.push_back(NameInLanguage(column));
 	for (const std::vector<Value>& row : inTable.mRows)
 	{
 		std::vector<std::string>& texts = cells.mRows.emplace_back();
@@ -141,7 +144,7 @@ void WriteTable(const Table& inTable, Style inStyle)
 		least.push_back(Widest(cells, column, WidestWord));
 	}
 	if (!inTable.mName.empty())
-		std::cout << '\n' << kIndent << Coloured(inTable.mName, kBold, inStyle) << '\n';
+		std::cout << '\n' << kIndent << Coloured(NameInLanguage(inTable.mName), kBold, inStyle) << '\n';
 	std::string_view between;
 	for (const Columns& part : PartsFor(widest, least, inStyle.mLineWidth))
 	{

@@ -1,5 +1,6 @@
 #include "zonmedia/Commands.h"
 #include "zonmedia/Input.h"
+#include "zonmedia/Texts.h"
 #include "zonmedia/TimeNames.h"
 
 #include <iostream>
@@ -68,8 +69,7 @@ Record MakeRecord(const std::string& inText, TickTime inTime, const Conversion& 
 	Record record{{"Value", inText}, {}};
 	record.mItems = {
 		Field{"Rate", {Text(rate), Text(rate.mStated)}},
-		Field{
-			"Rate is rounded", {rate.mIsRounded ? "yes: one frame is no whole number of ticks" : "", rate.mIsRounded}},
+		Field{"Rate is rounded", {rate.mIsRounded ? Say(kText_RoundedRate) : "", rate.mIsRounded}},
 		Field{"Display", NameOf(inConversion.mFrom)},
 		Field{"Ticks", inTime.GetTicks()},
 	};

@@ -2,6 +2,7 @@
 
 #include "zoncore/StringUtils.h"
 #include "zonmedia/Input.h"
+#include "zonmedia/Texts.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/TimeBase.h"
 
@@ -187,7 +188,7 @@ Rate ReadRate(std::string_view inText)
 
 std::string Text(const Rate& inRate)
 {
-	return Text(inRate.mStated) + " (" + UTF16to8(FrameRateDescription(inRate.mRate)) + ")";
+	return Text(inRate.mStated) + " (" + WithDecimalSign(UTF16to8(FrameRateDescription(inRate.mRate))) + ")";
 }
 
 std::span<const Named<TimeForm>> TimeForms()
@@ -215,7 +216,7 @@ TimeForm ChosenForm(TimeForm inForm, FrameRate inRate)
 
 std::string DescriptionOf(TimeForm inForm)
 {
-	return inForm.mDisplay ? UTF16to8(TimeDisplayDescription(*inForm.mDisplay)) : "Ticks";
+	return inForm.mDisplay ? UTF16to8(TimeDisplayDescription(*inForm.mDisplay)) : Say(kText_Ticks);
 }
 
 std::string TimeText(TickTime inTime, FrameRate inRate, TimeForm inForm, TimecodeFlags inFlags)
@@ -223,7 +224,8 @@ std::string TimeText(TickTime inTime, FrameRate inRate, TimeForm inForm, Timecod
 	if (!inForm.mDisplay)
 		return std::to_string(inTime.GetTicks());
 	const TimecodeFlags sign = inTime < kTime_Zero ? kTimecodeFlag_ShowSign : TimecodeFlags();
-	return UTF16to8(TimeToTimecode(inTime, inRate, *inForm.mDisplay, inFlags | sign));
+	const std::string text = UTF16to8(TimeToTimecode(inTime, inRate, *inForm.mDisplay, inFlags | sign));
+	return inForm.mDisplay == kTimeDisplay_Milliseconds ? WithDecimalSign(text) : text;
 }
 
 TickTime ReadTime(std::string_view inText, FrameRate inRate, TimeForm inForm)
@@ -232,7 +234,10 @@ TickTime ReadTime(std::string_view inText, FrameRate inRate, TimeForm inForm)
 		throw InputProblem("too large a number in it; expected " + std::to_string(most) + " at most");
 	if (inForm.mDisplay && !inText.empty() && (FramesPerFoot(inForm) == 0 || IsFeetAndFrames(inText)))
 	{
-		const TickTime time = TimecodeToTime(UTF8to16(inText), inRate, *inForm.mDisplay);
+		std::string text(inText);
+		if (inForm.mDisplay == kTimeDisplay_Milliseconds)
+			std::ranges::replace(text, ',', '.');   // as other languages write decimals
+		const TickTime time = TimecodeToTime(UTF8to16(text), inRate, *inForm.mDisplay);
 		if (time != kTime_Invalid)
 			return time;
 	}

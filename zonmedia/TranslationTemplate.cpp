@@ -1,5 +1,6 @@
 #include "zonmedia/TranslationTemplate.h"
 
+#include "zonmedia/Texts.h"
 #include "zonmediatypes/Descriptions.h"
 
 #include <array>
@@ -93,19 +94,24 @@ msgstr ""
 "Content-Transfer-Encoding: 8bit\n"
 )";
 
+void WriteMessage(std::ostream& ioStream, std::string_view inKey, std::string_view inNote)
+{
+	const TextKey key(inKey);
+	ioStream << '\n';
+	if (!inNote.empty())
+		ioStream << "#. " << inNote << '\n';
+	ioStream << "msgctxt " << PoString(key.mPath) << "\nmsgid " << PoString(key.mText) << "\nmsgstr \"\"\n";
+}
+
 }   // namespace
 
 void WriteTranslationTemplate(std::ostream& ioStream)
 {
 	ioStream << kHeader;
 	for (const std::string_view text : zonmediatypes::AllTextKeys())
-	{
-		const TextKey key(text);
-		ioStream << '\n';
-		if (const std::string_view note = NoteFor(key.mPath); !note.empty())
-			ioStream << "#. " << note << '\n';
-		ioStream << "msgctxt " << PoString(key.mPath) << "\nmsgid " << PoString(key.mText) << "\nmsgstr \"\"\n";
-	}
+		WriteMessage(ioStream, text, NoteFor(TextKey(text).mPath));
+	for (const auto& [text, note] : AllOwnTexts())
+		WriteMessage(ioStream, text, note);
 }
 
 }   // namespace zonmedia

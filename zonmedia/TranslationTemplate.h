@@ -10,7 +10,7 @@
 namespace zonmedia
 {
 
-/// A key of the library: a path and, behind its first "=", the English text.
+/// A key: a path and, behind its first "=", the English text.
 struct TextKey
 {
 	std::string_view mPath;
@@ -22,7 +22,7 @@ struct TextKey
 	}
 };
 
-/// Writes the template, a message with a note for each of the library's keys, in their order. The same library gives the
+/// Writes the template, a message with a note for each of the library's keys and the companion's, in their order. The same library gives the
 /// same bytes.
 void WriteTranslationTemplate(std::ostream& ioStream);
 

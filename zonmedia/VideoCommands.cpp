@@ -1,5 +1,6 @@
 #include "zoncore/StringUtils.h"
 #include "zonmedia/Commands.h"
+#include "zonmedia/Texts.h"
 #include "zonmedia/VideoNames.h"
 #include "zonmediatypes/Descriptions.h"
 #include "zonmediatypes/PixelAspectRatioUtils.h"
@@ -36,7 +37,7 @@ std::string Word(const std::array<const char*, N>& inWords, unsigned inCode)
 }
 
 constexpr std::array<const char*, 6> sDepths{"8", "10", "15", "16", "24", "32"};
-constexpr std::array<const char*, 4> sAlphas{"none", "straight", "premultiplied", "ignored"};
+constexpr std::array<const OwnText*, 4> sAlphas{&kText_None, &kText_Straight, &kText_Premultiplied, &kText_Ignored};
 constexpr std::array<const char*, 4> sSubsamplings{"4:4:4", "4:2:2", "DV", "4:2:0"};
 
 std::string Hexadecimal(std::uint32_t inValue)
@@ -48,14 +49,15 @@ std::string Hexadecimal(std::uint32_t inValue)
 std::vector<Value> FormatRow(const std::string& inName, PixelFormat inFormat)
 {
 	const PixelFormatProperties properties = inFormat.mProperties;
-	const std::string yuv
-		= std::string(properties.Is709() ? "YUV 709" : "YUV 601") + (properties.IsVideoRange() ? "" : " full");
+	const std::string matrix = properties.Is709() ? "YUV 709" : "YUV 601";
+	const unsigned alpha = properties.Alpha();
+	const std::string yuv = properties.IsVideoRange() ? matrix : Say(kText_FullRange, {matrix});
 	const std::string depth = Word(sDepths, properties.BitDepth()) + (properties.IsFloat() ? "f" : "u");
 	const std::uint32_t value = properties.GetValue();
 	return {inName, CodeOf(inFormat), {Hexadecimal(value), std::uint64_t{value}}, properties.IsYUV() ? yuv : "RGB",
-		depth, Word(sSubsamplings, properties.Subsampling()), Word(sAlphas, properties.Alpha()),
-		properties.ReversedOrder(), properties.IsLinear(), properties.IsCompressed(),
-		UTF16to8(PixelFormatDescription(inFormat))};
+		depth, Word(sSubsamplings, properties.Subsampling()),
+		alpha < sAlphas.size() ? Say(*sAlphas[alpha]) : std::to_string(alpha), properties.ReversedOrder(),
+		properties.IsLinear(), properties.IsCompressed(), UTF16to8(PixelFormatDescription(inFormat))};
 }
 
 Status RunFormats(const CommonArguments& inArguments)
@@ -88,7 +90,8 @@ struct NearestArguments : CostArguments
 Value CostValue(int inCost)
 {
 	const bool isPossible = inCost < kPixelConversionCost_Impossible;
-	return {std::to_string(inCost) + (isPossible ? "" : " (impossible)"), inCost};
+	const std::string cost = std::to_string(inCost);
+	return {isPossible ? cost : Say(kText_Impossible, {cost}), inCost};
 }
 
 Status RunCost(const CostArguments& inArguments)
@@ -98,7 +101,7 @@ Status RunCost(const CostArguments& inArguments)
 	const RenderQuality quality = ReadQuality(inArguments.mQuality);
 	const int cost = PixelConversionCost(from.mProperties, to.mProperties, quality);
 	Record record{{"From", FormatValue(from)}, {}};
-	record.mSubject.mValue.mText += " to " + NameOf(to);
+	record.mSubject.mValue.mText = Say(kText_FromTo, {record.mSubject.mValue.mText, NameOf(to)});
 	record.mItems = {
 		Field{"To", FormatValue(to)},
 		Field{"Quality", UTF16to8(RenderQualityDescription(quality))},
@@ -136,15 +139,14 @@ std::string Reason(const Choice& inChoice, const PixelFormats& inFrom, const Pix
 	const auto isIn = [&](const PixelFormats& inFormats)
 	{ return std::ranges::find(inFormats, inChoice.mChosen) != inFormats.end(); };
 	if (inChoice.mChosen == kPixelFormat_Invalid)
-		return "no format of either side can be used";
+		return Say(kText_NothingUsable);
 	if (inPrefersRequest && inChoice.mChosen == inRequest)
-		return "it was requested, and the destination takes it";
+		return Say(kText_Requested);
 	if (isIn(inFrom) && isIn(inTo))
-		return "both sides know it";
+		return Say(kText_BothKnow);
 	if (inChoice.mCost == kPixelConversionCost_Impossible)
-		return "nothing converts; it is the first that frames can be worked in";
-	return "the cheapest conversion, from " + NameOf(inChoice.mSource) + " at a cost of "
-		+ std::to_string(inChoice.mCost);
+		return Say(kText_NothingConverts);
+	return Say(kText_Cheapest, {NameOf(inChoice.mSource), std::to_string(inChoice.mCost)});
 }
 
 Json NamesOf(const PixelFormats& inFormats)
@@ -198,7 +200,7 @@ Value SizeValue(zoncore::PointT<int> inSize)
 // A byte count, of which 0 says that there is none.
 Value BytesValue(std::int64_t inBytes)
 {
-	return inBytes == 0 ? Value("none", nullptr) : Value(inBytes);
+	return inBytes == 0 ? Value(Say(kText_None), nullptr) : Value(inBytes);
 }
 
 Status RunSize(const SizeArguments& inArguments)
@@ -228,12 +230,11 @@ Status RunRatio(const SizeArguments& inArguments)
 	const bool isLegacy = IsLegacyPixelAspectRatio(ratio);
 	Record record{{"Ratio", inArguments.mSubject}, {}};
 	record.mItems = {
-		Field{"Description", UTF16to8(PixelAspectRatioDescription(ratio))},
-		Field{"Frame", UTF16to8(VideoFrameSizeDescription({0, 0, size.x, size.y}, ratio))},
+		Field{"Description", WithDecimalSign(UTF16to8(PixelAspectRatioDescription(ratio)))},
+		Field{"Frame", WithDecimalSign(UTF16to8(VideoFrameSizeDescription({0, 0, size.x, size.y}, ratio)))},
 		Field{"In square pixels", SizeValue(AdjustPixelAspectDimensionToSquarePixelDimension(size, ratio))},
 		Field{"From square pixels", SizeValue(AdjustSquarePixelDimensionToPixelAspectDimension(size, ratio))},
-		Field{"Legacy",
-			isLegacy ? Value("a wrong ratio of older projects for " + correction, correction) : Value("", nullptr)},
+		Field{"Legacy", isLegacy ? Value(Say(kText_LegacyRatio, {correction}), correction) : Value("", nullptr)},
 	};
 	Print(record, inArguments.GetStyle());
 	return Status::Fine;
