@@ -1,6 +1,6 @@
 #include "zonmediatypes/AudioChannelLayout.h"
 
-#include "tests/AudioTables.h"
+#include "tests/audio/AudioTables.h"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 #include "zonmediatypes/Descriptions.h"
 
-#include "tests/AudioTables.h"
+#include "tests/audio/AudioTables.h"
 #include "tests/HostileLocale.h"
-#include "tests/PixelFormatTable.h"
+#include "tests/video/PixelFormatTable.h"
 #include "tests/WithTranslator.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16Stream.h"

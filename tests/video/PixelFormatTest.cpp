@@ -1,4 +1,4 @@
-#include "tests/PixelFormatTable.h"
+#include "tests/video/PixelFormatTable.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 #include "zonmediatypes/AudioChannelMap.h"
 
-#include "tests/AudioTables.h"
+#include "tests/audio/AudioTables.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "tests/AudioTables.h"
+#include "tests/audio/AudioTables.h"
 
 #include <gtest/gtest.h>
 

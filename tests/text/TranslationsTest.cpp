@@ -1,6 +1,6 @@
 // The translations: each is whole, keeps what the texts are filled with, and reaches users.
 
-#include "tests/ProgramRunner.h"
+#include "tests/companion/ProgramRunner.h"
 #include "zoncore/Localizer.h"
 #include "zoncore/MessageCatalogue.h"
 #include "zoncore/StringUtils.h"

@@ -1,6 +1,6 @@
 // The companion, run as its users run it: what it prints, what it complains about and how it ends.
 
-#include "tests/ProgramRunner.h"
+#include "tests/companion/ProgramRunner.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 #include "zonmediatypes/PixelFormatSize.h"
 
-#include "tests/PixelFormatTable.h"
+#include "tests/video/PixelFormatTable.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 #include "zonmediatypes/AudioFormat.h"
 
-#include "tests/AudioTables.h"
+#include "tests/audio/AudioTables.h"
 
 #include <gtest/gtest.h>
 
