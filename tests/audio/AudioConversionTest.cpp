@@ -1,7 +1,7 @@
 #include "zonmediatypes/AudioChannelLayout.h"
 
-#include "tests/audio/AudioTables.h"
 #include "tests/Walks.h"
+#include "tests/audio/AudioTables.h"
 
 #include <gtest/gtest.h>
 

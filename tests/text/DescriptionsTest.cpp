@@ -1,9 +1,9 @@
 #include "zonmediatypes/Descriptions.h"
 
-#include "tests/audio/AudioTables.h"
 #include "tests/HostileLocale.h"
-#include "tests/video/PixelFormatTable.h"
 #include "tests/WithTranslator.h"
+#include "tests/audio/AudioTables.h"
+#include "tests/video/PixelFormatTable.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/UTF16Stream.h"
 
