@@ -2,14 +2,12 @@
 // that once mattered. It fails where an invariant does not hold, and where no input reaches one of the target's checks.
 
 #include "fuzz/Checks.h"
+#include "tests/Platform.h"
 #include "tests/TestLocale.h"
 
 #include <cstddef>
 #include <cstdint>
 #include <cstdio>
-#include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <string>
 #include <vector>
 
@@ -18,11 +16,10 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* inData, std::size_t in
 namespace
 {
 
-void Replay(const std::filesystem::path& inPath)
+void Replay(const std::string& inFolder, const std::string& inName)
 {
-	std::ifstream file(inPath, std::ios::binary);
-	const std::vector<char> bytes{std::istreambuf_iterator<char>(file), {}};
-	std::printf("%s\n", inPath.filename().c_str());
+	const std::string bytes = zontest::ReadFile(inFolder + '/' + inName);
+	std::printf("%s\n", inName.c_str());
 	std::fflush(stdout);   // the name of the input that ends the program is the last one
 	LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
 }
@@ -46,9 +43,9 @@ int main(int inCount, char** inArguments)
 	int files = 0;
 	for (int i = 1; i < inCount; ++i)
 	{
-		for (const auto& entry : std::filesystem::directory_iterator(inArguments[i]))
+		for (const std::string& name : zontest::FilesOf(inArguments[i]))
 		{
-			Replay(entry.path());
+			Replay(inArguments[i], name);
 			++files;
 		}
 	}

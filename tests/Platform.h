@@ -1,7 +1,15 @@
 #pragma once
 
+#include <cstdio>
 #include <cstdlib>
 #include <string>
+#include <vector>
+
+#if defined(__wasi__)   // its C++ library has no files
+	#include <dirent.h>
+#else
+	#include <filesystem>
+#endif
 
 #if defined(_WIN32)
 	#include <csignal>
@@ -31,6 +39,38 @@ inline std::string ProcessId()
 #else
 	return std::to_string(::getpid());
 #endif
+}
+
+/// The bytes of a file, by the C library, since not every C++ library has files; empty when it cannot be read.
+inline std::string ReadFile(const std::string& inPath)
+{
+	std::string bytes;
+	std::FILE* const file = std::fopen(inPath.c_str(), "rb");
+	if (file == nullptr)
+		return bytes;
+	for (int byte = std::fgetc(file); byte != EOF; byte = std::fgetc(file))
+		bytes.push_back(static_cast<char>(byte));
+	std::fclose(file);
+	return bytes;
+}
+
+/// The names of the files of a folder, in any order.
+inline std::vector<std::string> FilesOf(const std::string& inFolder)
+{
+	std::vector<std::string> names;
+#if defined(__wasi__)
+	::DIR* const folder = ::opendir(inFolder.c_str());
+	if (folder == nullptr)
+		return names;
+	while (const ::dirent* const entry = ::readdir(folder))
+		if (entry->d_name[0] != '.')
+			names.emplace_back(entry->d_name);
+	::closedir(folder);
+#else
+	for (const auto& entry : std::filesystem::directory_iterator(inFolder))
+		names.push_back(entry.path().filename().string());
+#endif
+	return names;
 }
 
 /// What the C library reads and writes has a decimal point for as long as this lives, whatever locale the run is under.

@@ -7,7 +7,9 @@ set(CMAKE_CXX_COMPILER clang++-19)
 set(CMAKE_CXX_COMPILER_TARGET wasm32-wasi)
 set(CMAKE_AR llvm-ar-19)
 set(CMAKE_RANLIB llvm-ranlib-19)
-set(CMAKE_EXECUTABLE_SUFFIX .wasm)
+list(APPEND CMAKE_MODULE_PATH "${CMAKE_CURRENT_LIST_DIR}")   # Platform/WASI.cmake
+include("${CMAKE_CURRENT_LIST_DIR}/OlderBoost.cmake")
+set(CMAKE_CXX_FLAGS_INIT ${ZON_LIBCXX_FOR_OLDER_BOOST})
 # What throws an exception comes from the host: run-wasi.mjs.
 set(CMAKE_EXE_LINKER_FLAGS_INIT "-Wl,--allow-undefined-file=${CMAKE_CURRENT_LIST_DIR}/wasi-imports.txt")
 set(CMAKE_CROSSCOMPILING_EMULATOR node;--no-warnings;${CMAKE_CURRENT_LIST_DIR}/run-wasi.mjs)

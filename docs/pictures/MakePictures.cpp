@@ -29,7 +29,7 @@ constexpr auto sPictures = std::to_array<NamedPicture>({
 int main(int inCount, char** inArguments)
 {
 	const std::string_view name = inCount == 2 ? inArguments[1] : "";
-	const auto* const picture = std::ranges::find(sPictures, name, &NamedPicture::mName);
+	const auto picture = std::ranges::find(sPictures, name, &NamedPicture::mName);
 	if (picture == sPictures.end())
 	{
 		std::cerr << "usage: MakePictures NAME\n";

@@ -25,11 +25,12 @@ using Messages = std::map<std::string, std::string>;   // texts by context, EOT 
 std::optional<Messages> ReadAgain(std::string_view inBytes)
 {
 	const bool isOtherOrder = inBytes.starts_with("\x95\x04\x12\xDE");
+	const auto byte = [&](std::uint64_t inAt) { return inBytes[static_cast<std::size_t>(inAt)]; };
 	const auto word = [&](std::uint64_t inAt)
 	{
 		std::uint64_t value = 0;
 		for (std::size_t i = 0; i < 4; ++i)
-			value = value << 8 | static_cast<unsigned char>(inBytes[inAt + (isOtherOrder ? i : 3 - i)]);
+			value = value << 8 | static_cast<unsigned char>(byte(inAt + (isOtherOrder ? i : 3 - i)));
 		return value;
 	};
 	if (inBytes.size() < 28 || word(0) != 0x950412DE || word(4) >= 0x20000)
@@ -46,9 +47,9 @@ std::optional<Messages> ReadAgain(std::string_view inBytes)
 		for (std::size_t k = 0; k < 2; ++k)
 		{
 			const std::uint64_t entry = word(12 + 4 * k) + 8 * i, length = word(entry), begin = word(entry + 4);
-			if (begin + length >= inBytes.size() || inBytes[begin + length] != '\0')
+			if (begin + length >= inBytes.size() || byte(begin + length) != '\0')
 				return std::nullopt;
-			texts[k] = inBytes.substr(begin, length);
+			texts[k] = inBytes.substr(static_cast<std::size_t>(begin), static_cast<std::size_t>(length));
 		}
 		if (texts[0].empty())
 			header = texts[1];

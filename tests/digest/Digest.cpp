@@ -2,6 +2,7 @@
 //   Digest LIST      the list names a file a line: message catalogues (.mo), which give the languages, and files with any
 //                    text for the readers of text
 
+#include "tests/Platform.h"
 #include "zoncore/Localizer.h"
 #include "zoncore/MessageCatalogue.h"
 #include "zoncore/NumberConversion.h"
@@ -283,32 +284,19 @@ std::string LanguageOf(std::string_view inPath)
 	return std::string(inPath.substr(0, folder)).substr(inPath.substr(0, folder).rfind('/') + 1);
 }
 
-// By the C library: not every system has file streams. Empty when it cannot be read.
-std::string ReadFile(const std::string& inPath)
-{
-	std::string bytes;
-	std::FILE* const file = std::fopen(inPath.c_str(), "rb");
-	if (file == nullptr)
-		return bytes;
-	for (int byte = std::fgetc(file); byte != EOF; byte = std::fgetc(file))
-		bytes.push_back(static_cast<char>(byte));
-	std::fclose(file);
-	return bytes;
-}
-
 }   // namespace
 
 int main(int inCount, char** inArguments)
 {
 	std::vector<UTF16String> texts;
 	std::vector<std::string> catalogues;
-	std::istringstream list(ReadFile(inCount == 2 ? inArguments[1] : ""));
+	std::istringstream list(zontest::ReadFile(inCount == 2 ? inArguments[1] : ""));
 	for (std::string path; std::getline(list, path);)
 	{
 		if (path.ends_with(".mo"))
 			catalogues.push_back(path);
 		else
-			texts.push_back(zoncore::utility::UTF8to16(ReadFile(path)));
+			texts.push_back(zoncore::utility::UTF8to16(zontest::ReadFile(path)));
 	}
 	const std::vector<TickTime> times = Times();
 	PrintTime(times);
