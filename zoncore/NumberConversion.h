@@ -73,7 +73,7 @@ bool StringToNumber(const UTF16String& inText, Number& outValue, unsigned inOpti
 /// The fraction closest to inValue with both terms in -2147483646..2147483646; of two equally close ones that with the
 /// smaller denominator, then the one nearer to zero. NaN gives 0/1; a larger magnitude gives plus or minus 2147483646/1.
 /// The closest fraction to a rounded quotient need not be the quotient's own. Costs some dozens of divisions at most. Using
-/// it takes <boost/rational.hpp>.
+/// it takes zoncore/Rational.h.
 ///
 /// Compare a boost::rational with a boost::rational only: with a bare integer the comparison never returns in C++20 with
 /// the supported compilers and Boost.

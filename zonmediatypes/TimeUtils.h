@@ -10,12 +10,11 @@
 /// Compare a boost::rational with a boost::rational only, never with a bare integer: with C++20, g++ 12 and Boost 1.74
 /// that comparison never returns.
 
+#include "zoncore/Rational.h"
 #include "zonmediatypes/Export.h"
 #include "zonmediatypes/FrameRate.h"
 #include "zonmediatypes/RatioTime.h"
 #include "zonmediatypes/TickTime.h"
-
-#include <boost/rational.hpp>
 
 namespace zonmediatypes
 {

@@ -5,6 +5,7 @@ set(CMAKE_SYSTEM_PROCESSOR wasm32)
 set(CMAKE_C_COMPILER clang-19)
 set(CMAKE_CXX_COMPILER clang++-19)
 set(CMAKE_CXX_COMPILER_TARGET wasm32-wasi)
+set(CMAKE_FIND_ROOT_PATH /usr/lib/wasm32-wasi)
 set(CMAKE_AR llvm-ar-19)
 set(CMAKE_RANLIB llvm-ranlib-19)
 list(APPEND CMAKE_MODULE_PATH "${CMAKE_CURRENT_LIST_DIR}")   # Platform/WASI.cmake

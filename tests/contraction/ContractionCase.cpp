@@ -8,9 +8,11 @@
 // above, and comes to -31. Exit status 77: the processor has no contracted multiply-add to show it with.
 int main()
 {
+#if defined(__x86_64__) || defined(__i386__)
 	constexpr int kSkipped = 77;
 	if (!__builtin_cpu_supports("fma"))
 		return kSkipped;
+#endif
 	const zonmediatypes::utility::BeatInfo beatInfo{960, 63.0, 4, 4, 0.0};
 	const auto samples = zonmediatypes::utility::ConvertBarsAndBeatsToSamples(
 		zoncore::utility::AsciiToUTF16("0:-1"), 34.125, beatInfo, true);

@@ -1,5 +1,6 @@
 #include "zoncore/NumberConversion.h"
 
+#include "zoncore/Rational.h"
 #include "zoncore/StringUtils.h"
 #include "zoncore/TextScanner.h"
 #include "zoncore/WideInteger.h"
@@ -8,7 +9,6 @@
 
 #include <algorithm>
 #include <array>
-#include <boost/rational.hpp>
 #include <charconv>
 #include <cmath>
 #include <cstddef>

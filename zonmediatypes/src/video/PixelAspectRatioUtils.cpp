@@ -1,10 +1,10 @@
 #include "zonmediatypes/PixelAspectRatioUtils.h"
 
 #include "zoncore/NumberConversion.h"
+#include "zoncore/Rational.h"
 #include "zoncore/WrappingArithmetic.h"
 
 #include <array>
-#include <boost/rational.hpp>
 #include <cstdint>
 #include <numeric>
 
