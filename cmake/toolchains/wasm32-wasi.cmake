@@ -10,7 +10,8 @@ set(CMAKE_AR llvm-ar-19)
 set(CMAKE_RANLIB llvm-ranlib-19)
 list(APPEND CMAKE_MODULE_PATH "${CMAKE_CURRENT_LIST_DIR}")   # Platform/WASI.cmake
 include("${CMAKE_CURRENT_LIST_DIR}/OlderBoost.cmake")
-set(CMAKE_CXX_FLAGS_INIT ${ZON_LIBCXX_FOR_OLDER_BOOST})
+# Debian's runtime library lacks what its own division of 128-bit integers calls: there are none, then.
+set(CMAKE_CXX_FLAGS_INIT "${ZON_LIBCXX_FOR_OLDER_BOOST} -U__SIZEOF_INT128__")
 # What throws an exception comes from the host: run-wasi.mjs.
 set(CMAKE_EXE_LINKER_FLAGS_INIT "-Wl,--allow-undefined-file=${CMAKE_CURRENT_LIST_DIR}/wasi-imports.txt")
 set(CMAKE_CROSSCOMPILING_EMULATOR node;--no-warnings;${CMAKE_CURRENT_LIST_DIR}/run-wasi.mjs)

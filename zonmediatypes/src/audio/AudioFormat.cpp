@@ -102,8 +102,9 @@ bool AudioFormatExactCompare::operator()(const AudioFormat& inLHS, const AudioFo
 {
 	if (inLHS.GetSampleRate() != inRHS.GetSampleRate())
 		return inLHS.GetSampleRate() < inRHS.GetSampleRate();
-	const auto layouts = inLHS.GetChannelLayout() <=> inRHS.GetChannelLayout();
-	return layouts == 0 ? inLHS.GetSampleType() < inRHS.GetSampleType() : layouts < 0;
+	if (inLHS.GetChannelLayout() != inRHS.GetChannelLayout())
+		return inLHS.GetChannelLayout() < inRHS.GetChannelLayout();
+	return inLHS.GetSampleType() < inRHS.GetSampleType();
 }
 
 bool AudioFormatSimpleCompare::operator()(const AudioFormat& inLHS, const AudioFormat& inRHS) const noexcept
