@@ -29,6 +29,13 @@
 namespace zontest
 {
 
+/// Whether an exception that is thrown can be caught.
+#if defined(__wasi__)
+inline constexpr bool kHasExceptions = false;
+#else
+inline constexpr bool kHasExceptions = true;
+#endif
+
 /// A number that no other process has now.
 inline std::string ProcessId()
 {

@@ -14,6 +14,7 @@
 /// kTime_Invalid is a time like any other here, 400,000 s before zero: compare with it first.
 
 #include "zoncore/Reciprocal.h"
+#include "zoncore/WideInteger.h"
 #include "zoncore/WrappingArithmetic.h"
 #include "zonmediatypes/TickTime.h"
 
@@ -97,8 +98,6 @@ private:
 namespace detail
 {
 
-__extension__ using UInt128 = unsigned __int128;
-
 /// What the magnitude of a dividend grows by, so that its truncated quotient is the rounded one.
 constexpr std::uint64_t RoundingBias(std::uint64_t inDivisor, bool inIsNegative, Rounding inRounding) noexcept
 {
@@ -125,19 +124,18 @@ constexpr std::optional<std::int64_t> TimeBase::Rescale(
 	using zoncore::utility::Magnitude;
 	const auto divisor = static_cast<std::uint64_t>(inDivisor.mNumber);
 	const std::uint64_t bias = detail::RoundingBias(divisor, inValue < 0, inRounding);
-	std::int64_t product = 0;
-	if (!__builtin_mul_overflow(inValue, inFactor.mNumber, &product))
+	if (const auto product = zoncore::utility::CheckedMultiply(inValue, inFactor.mNumber))
 	{
-		const std::uint64_t dividend = Magnitude(product) + bias;
+		const std::uint64_t dividend = Magnitude(*product) + bias;
 		if (dividend < zoncore::utility::Reciprocal::kMostDividend)
 		{
 			const auto quotient = static_cast<std::int64_t>(inDivisor.mReciprocal.Divide(dividend));
 			return inValue < 0 ? -quotient : quotient;
 		}
 	}
-	const detail::UInt128 dividend
-		= detail::UInt128{Magnitude(inValue)} * static_cast<std::uint64_t>(inFactor.mNumber) + bias;
-	const detail::UInt128 quotient = dividend / divisor;
+	using zoncore::utility::UInt128;
+	const UInt128 dividend = UInt128{Magnitude(inValue)} * static_cast<std::uint64_t>(inFactor.mNumber) + bias;
+	const UInt128 quotient = dividend / divisor;
 	const std::uint64_t most = Magnitude(std::numeric_limits<std::int64_t>::max()) + (inValue < 0 ? 1 : 0);
 	if (quotient > most)
 		return std::nullopt;
@@ -152,10 +150,8 @@ constexpr std::optional<TimeBase> TimeBase::FromRatio(std::int64_t inNumerator, 
 	const std::int64_t common = std::gcd(kTicksPerSecond, inDenominator);
 	const std::int64_t denominator = inDenominator / common;
 	const std::int64_t reduced = std::gcd(inNumerator, denominator);
-	std::int64_t ticks = 0;
-	if (__builtin_mul_overflow(kTicksPerSecond / common, inNumerator / reduced, &ticks))
-		return std::nullopt;
-	return TimeBase(ticks, denominator / reduced);
+	const auto ticks = zoncore::utility::CheckedMultiply(kTicksPerSecond / common, inNumerator / reduced);
+	return ticks ? std::optional(TimeBase(*ticks, denominator / reduced)) : std::nullopt;
 }
 
 constexpr std::optional<TimeBase> TimeBase::FromRate(FrameRate inRate) noexcept
@@ -168,10 +164,8 @@ constexpr std::optional<TimeBase> TimeBase::FromRate(FrameRate inRate) noexcept
 constexpr std::optional<TimeBase::Ratio> TimeBase::ToRatio() const noexcept
 {
 	const std::int64_t common = std::gcd(mTicks.mNumber, kTicksPerSecond);
-	std::int64_t denominator = 0;
-	if (__builtin_mul_overflow(kTicksPerSecond / common, mUnits.mNumber, &denominator))
-		return std::nullopt;
-	return Ratio{mTicks.mNumber / common, denominator};
+	const auto denominator = zoncore::utility::CheckedMultiply(kTicksPerSecond / common, mUnits.mNumber);
+	return denominator ? std::optional(Ratio{mTicks.mNumber / common, *denominator}) : std::nullopt;
 }
 
 constexpr std::optional<std::int64_t> TimeBase::FromTicks(TickTime inTime, Rounding inRounding) const noexcept
