@@ -5,6 +5,7 @@
 #include "zonmediatypes/src/text/TextKeys.h"
 #include "zonmediatypes/src/text/TimeTextKeys.h"
 #include "zonmediatypes/src/time/RateText.h"
+#include "zonmediatypes/src/timecode/TimeDisplayTable.h"
 
 #include <algorithm>
 #include <boost/lexical_cast.hpp>
@@ -21,6 +22,18 @@ using zoncore::utility::UTF8to16;
 
 namespace
 {
+
+constexpr bool IsDescribed(const TimeDisplayRow& inRow)
+{
+	return std::ranges::find(kTimeDisplayKeys, inRow.mDisplay, &KeyFor<TimeDisplay>::mValue) != kTimeDisplayKeys.end();
+}
+static_assert(std::ranges::all_of(kTimeDisplayTable,
+				  [](const TimeDisplayRow& inRow)
+				  {
+					  const bool isDisplay = inRow.mKind != DisplayKind::Auto && inRow.mKind != DisplayKind::None;
+					  return IsDescribed(inRow) == isDisplay;
+				  }),
+	"every display but the automatic one has a description");
 
 UTF16String RateFormat(FrameRate inRate)
 {
