@@ -36,6 +36,8 @@ namespace zoncore
 template <class E>
 class BadExpectedAccess;
 
+// Doxygen takes a class whose base is a specialisation of it for one that inherits from itself.
+/// \cond
 template <>
 class BadExpectedAccess<void> : public std::exception
 {
@@ -56,6 +58,7 @@ public:
 private:
 	E mError;
 };
+/// \endcond
 
 /// A reason, to be returned where an Expected is.
 template <class E>
