@@ -60,58 +60,10 @@ private:
 };
 /// \endcond
 
-/// A reason, to be returned where an Expected is.
-template <class E>
-class Unexpected
-{
-public:
-	template <class Error = E>
-		requires std::constructible_from<E, Error> &&(!std::same_as<std::remove_cvref_t<Error>, Unexpected>)&&(
-			!std::same_as<std::remove_cvref_t<Error>, std::in_place_t>)explicit constexpr Unexpected(Error&& inError)
-			: mError(std::forward<Error>(inError))
-		{
-		}
-		template <class... Arguments>
-			requires std::constructible_from<E, Arguments...>
-		explicit constexpr Unexpected(std::in_place_t, Arguments&&... inArguments)
-			: mError(std::forward<Arguments>(inArguments)...)
-		{
-		}
-
-		constexpr const E& error() const& noexcept
-		{
-			return mError;
-		}
-		constexpr E& error() & noexcept
-		{
-			return mError;
-		}
-		constexpr E&& error() && noexcept
-		{
-			return std::move(mError);
-		}
-
-		friend constexpr bool operator==(const Unexpected& inLHS, const Unexpected& inRHS)
-		{
-			return inLHS.mError == inRHS.mError;
-		}
-
-	private:
-		E mError;
-};
-
-template <class E>
-Unexpected(E) -> Unexpected<E>;
-
-/// Says that what follows makes the reason.
-struct UnexpectedTag
-{
-	explicit UnexpectedTag() = default;
-};
-inline constexpr UnexpectedTag unexpect{};
-
 template <class T, class E>
 class Expected;
+template <class E>
+class Unexpected;
 
 namespace detail
 {
@@ -125,6 +77,66 @@ inline constexpr bool kIsUnexpected = false;
 template <class E>
 inline constexpr bool kIsUnexpected<Unexpected<E>> = true;
 
+/// What Expected<void, E> holds in place of a value.
+template <class T>
+using HeldValue = std::conditional_t<std::is_void_v<T>, std::monostate, T>;
+
+/// Neither a value nor a reason in a wrapping of this header.
+template <class Type>
+concept Plain = !kIsExpected<std::remove_cvref_t<Type>> && !kIsUnexpected<std::remove_cvref_t<Type>>;
+
+/// Makes the value of an Expected<T, E>.
+template <class Type, class T>
+concept ValueFor = Plain<Type> && !std::is_void_v<T> && std::constructible_from<HeldValue<T>, Type>;
+
+/// Makes the reason of an Unexpected<E>.
+template <class Type, class E>
+concept ReasonFor
+	= Plain<Type> && !std::same_as<std::remove_cvref_t<Type>, std::in_place_t> && std::constructible_from<E, Type>;
+
+}   // namespace detail
+
+/// A reason, to be returned where an Expected is.
+template <class E>
+class Unexpected
+{
+public:
+	template <class Error = E>
+		requires detail::ReasonFor<Error, E>
+	explicit constexpr Unexpected(Error&& inError) : mError(std::forward<Error>(inError)) {}
+	template <class... Arguments>
+		requires std::constructible_from<E, Arguments...>
+	explicit constexpr Unexpected(std::in_place_t, Arguments&&... inArguments)
+		: mError(std::forward<Arguments>(inArguments)...)
+	{
+	}
+
+	constexpr const E& error() const& noexcept { return mError; }
+	constexpr E& error() & noexcept { return mError; }
+	constexpr E&& error() && noexcept { return std::move(mError); }
+
+	friend constexpr bool operator==(const Unexpected& inLHS, const Unexpected& inRHS)
+	{
+		return inLHS.mError == inRHS.mError;
+	}
+
+private:
+	E mError;
+};
+
+template <class E>
+Unexpected(E) -> Unexpected<E>;
+
+/// Says that what follows makes the reason.
+struct UnexpectedTag
+{
+	explicit UnexpectedTag() = default;
+};
+inline constexpr UnexpectedTag unexpect{};
+
+namespace detail
+{
+
 /// Calls a function, or takes a member of inValue.
 template <class Function, class Value>
 constexpr decltype(auto) Call(Function&& inFunction, Value&& inValue)
@@ -136,10 +148,6 @@ constexpr decltype(auto) Call(Function&& inFunction, Value&& inValue)
 	else
 		return std::forward<Function>(inFunction)(std::forward<Value>(inValue));
 }
-
-/// What Expected<void, E> holds in place of a value.
-template <class T>
-using HeldValue = std::conditional_t<std::is_void_v<T>, std::monostate, T>;
 
 }   // namespace detail
 
@@ -159,14 +167,10 @@ public:
 
 	// ---- Making one --------------------------------------------------------------------------------------------------
 
-	constexpr Expected() requires std::default_initializable<Held>
-	= default;
+	constexpr Expected() = default;
 
 	template <class U = T>
-		requires(!std::is_void_v<T>)
-	&& std::constructible_from<Held, U>
-		&& (!detail::kIsUnexpected<std::remove_cvref_t<U>>) && (!std::same_as<std::remove_cvref_t<U>, Expected>)
-		&& (!detail::kIsExpected<std::remove_cvref_t<U>>)
+		requires detail::ValueFor<U, T>
 	explicit(!std::convertible_to<U, Held>) constexpr Expected(U&& inValue)
 		: mState(std::in_place_index<0>, std::forward<U>(inValue))
 	{
@@ -324,9 +328,8 @@ public:
 			return *inLHS == *inRHS;
 	}
 	template <class U>
-		requires(!std::is_void_v<T>)
-	&&(!detail::kIsExpected<U>)&&(!detail::kIsUnexpected<U>)friend constexpr bool operator==(
-		const Expected& inLHS, const U& inValue)
+		requires detail::Plain<U>
+	friend constexpr bool operator==(const Expected& inLHS, const U& inValue)
 	{
 		return inLHS.has_value() && *inLHS == inValue;
 	}
