@@ -9,7 +9,7 @@
 ///         [](std::string_view inKey, UTF16String& outText)
 ///         {
 ///             if (!inKey.starts_with("$$$/zonmediatypes/RenderQuality/Draft="))
-///                 return false;   // the English text behind "="
+///                 return false;   // the English text after "="
 ///             outText = utility::UTF8to16("Entwurf");
 ///             return true;
 ///         });
@@ -41,12 +41,12 @@ class ZONCORE_API Localizer
 public:
 	static Localizer& Get() noexcept;
 
-	/// The translation of inKey by the translator, else by the catalogue, else the English text behind its first "="
+	/// The translation of inKey by the translator, else by the catalogue, else the English text after its first "="
 	/// (UTF-8); a key without "=" has an empty one. Costs two atomic loads and the text when neither is installed. Safe on
 	/// any thread.
 	UTF16String Lookup(std::string_view inKey) const;
 
-	/// The same with inEnglish, the text behind the first "=", at hand: saves the search for it.
+	/// The same with inEnglish, the text after the first "=", at hand: saves the search for it.
 	UTF16String Lookup(std::string_view inKey, std::string_view inEnglish) const;
 
 	/// The same with its placeholders filled, see FillPlaceholders; cheaper than filling the text that Lookup gives.

@@ -6,7 +6,7 @@
 
 #if defined(_MSVC_LANG) ? _MSVC_LANG < 202002L : __cplusplus < 202002L
 	#error "zonmediatypes needs C++20: compile with -std=c++20 or later (Microsoft's compiler: /std:c++20)"
-	#include "C++20 or later"   // does not exist, which stops a compiler that goes on behind #error
+	#include "C++20 or later"   // does not exist, which stops a compiler that goes on after #error
 #endif
 
 #include <version>

@@ -36,8 +36,8 @@ CLI::Validator NumberWhere(bool (*inIsFine)(Number), const std::string& inWhat, 
 	{
 		Number number{};
 		const char* const end = inText.data() + inText.size();
-		const auto [behind, error] = std::from_chars(inText.data(), end, number);
-		const bool isFine = error == std::errc() && behind == end && inIsFine(number);
+		const auto [rest, error] = std::from_chars(inText.data(), end, number);
+		const bool isFine = error == std::errc() && rest == end && inIsFine(number);
 		return isFine ? std::string() : Quoted(inText) + " is no " + inWhat + "; expected " + inExpected;
 	};
 	return {problem, inExpected};

@@ -26,12 +26,12 @@ constexpr const char* kFooter = R"(Exit status:
      was still done, in English when it is the language that is missing
   2  the arguments make no command)";
 
-const std::string kValuesBehind = "--";
+const std::string kValuesAfter = "--";
 
-// A value such as "-:30" begins as an option does; behind "--" everything is a value.
+// A value such as "-:30" begins as an option does; after "--" everything is a value.
 std::vector<std::string> ValuesLast(std::vector<std::string> inArguments)
 {
-	if (std::ranges::find(inArguments, kValuesBehind) != inArguments.end())
+	if (std::ranges::find(inArguments, kValuesAfter) != inArguments.end())
 		return inArguments;
 	const auto isOption = [](std::string_view inArgument)
 	{
@@ -41,7 +41,7 @@ std::vector<std::string> ValuesLast(std::vector<std::string> inArguments)
 	};
 	const auto values = std::stable_partition(inArguments.begin(), inArguments.end(), isOption);
 	if (values != inArguments.end())
-		inArguments.insert(values, kValuesBehind);
+		inArguments.insert(values, kValuesAfter);
 	return inArguments;
 }
 
@@ -53,7 +53,7 @@ std::vector<std::string> CommandsOf(const CLI::App& inLevel)
 	return names;
 }
 
-// The options that may stand behind a command: its own, and those of the whole program.
+// The options that may stand after a command: its own, and those of the whole program.
 std::vector<std::string> OptionsOf(const CLI::App& inLevel)
 {
 	std::vector<std::string> names;
@@ -72,7 +72,7 @@ std::vector<std::string> OptionsOf(const CLI::App& inLevel)
 }
 
 // What is wrong with the first of the arguments that the parser had no use for.
-std::string Unexpected(const std::string& inExtra, const CLI::App& inLevel, bool inIsBehindMark)
+std::string Unexpected(const std::string& inExtra, const CLI::App& inLevel, bool inIsAfterMark)
 {
 	const std::vector<std::string> commands = CommandsOf(inLevel);
 	if (!inExtra.starts_with('-'))
@@ -82,14 +82,13 @@ std::string Unexpected(const std::string& inExtra, const CLI::App& inLevel, bool
 	const std::string name = inExtra.substr(0, inExtra.find('='));
 	if (std::ranges::find(options, name) == options.end())
 		return UnknownName("option", name, {options.begin(), options.end()});
-	return name
-		+ (inIsBehindMark ? " stands behind \"--\", where everything is a value" : " stands behind the command");
+	return name + (inIsAfterMark ? " stands after \"--\", where everything is a value" : " stands after the command");
 }
 
 std::vector<std::string> Unused(const CLI::App& inApplication)
 {
 	std::vector<std::string> extras = inApplication.remaining(true);
-	std::erase(extras, kValuesBehind);
+	std::erase(extras, kValuesAfter);
 	return extras;
 }
 
@@ -108,14 +107,14 @@ std::string Explanation(
 	const CLI::App& level = Innermost(inApplication);
 	if (const std::vector<std::string> extras = Unused(inApplication); !extras.empty())
 	{
-		const auto mark = std::ranges::find(inArguments, kValuesBehind);
-		const bool isBehindMark = std::find(mark, inArguments.end(), extras.front()) != inArguments.end();
-		return Unexpected(extras.front(), level, isBehindMark);
+		const auto mark = std::ranges::find(inArguments, kValuesAfter);
+		const bool isAfterMark = std::find(mark, inArguments.end(), extras.front()) != inArguments.end();
+		return Unexpected(extras.front(), level, isAfterMark);
 	}
 	if (const std::vector<std::string> commands = CommandsOf(level); !commands.empty())
 		return "a command is required: " + Joined(std::vector<std::string_view>(commands.begin(), commands.end()));
 	const std::string said = inError.what();
-	const std::size_t colon = std::min(said.find(": "), said.size());   // behind the option that is wrong
+	const std::size_t colon = std::min(said.find(": "), said.size());   // after the option that is wrong
 	if (dynamic_cast<const CLI::ArgumentMismatch*>(&inError) != nullptr)
 		return said.substr(0, colon) + (said.ends_with("missing") ? " needs a value" : " is given more than once");
 	return dynamic_cast<const CLI::ValidationError*>(&inError) != nullptr ? std::string(said).erase(colon, 1) : said;
@@ -169,7 +168,7 @@ Status RunCommandLine(const std::vector<std::string>& inArguments)
 	application.add_option("--language", language,
 		"Language of the texts, one of: " + LanguageNames() + "; or a message catalogue, such as ./de.mo");
 	application.ignore_case();
-	application.fallthrough();   // --language may stand behind the command, too
+	application.fallthrough();   // --language may stand after the command, too
 	application.require_subcommand(1);
 	AddSheetCommand(application, run);
 	AddTimeCommand(application, run);

@@ -51,7 +51,7 @@ void CheckIsFile(const std::string& inPath)
 // ---- What is wrong ---------------------------------------------------------------------------------------------------
 
 // The kinds of a QuickTime file's outermost atoms are read until one is inKind. Each has its size in front of its kind: 1 is
-// a size that did not fit and comes behind, 0 an atom up to the end of the file.
+// a size that did not fit and follows, 0 an atom up to the end of the file.
 bool HasAtom(AVIOContext& ioFile, std::uint32_t inKind)
 {
 	constexpr std::int64_t kMostAtoms = 10'000;

@@ -48,7 +48,7 @@ std::string NamesOf(std::span<const Named<T>> inAll)
 	return Joined(names);
 }
 
-/// The items of inText, which has inMark between them and may have one behind the last. Throws UsageProblem when one is
+/// The items of inText, which has inMark between them and may have one after the last. Throws UsageProblem when one is
 /// empty.
 std::vector<std::string_view> ItemsOf(std::string_view inText, char inMark);
 

@@ -29,7 +29,7 @@ constexpr std::size_t kLeastText = 20;   // columns that a text gets, however na
 
 // ---- Text for people -------------------------------------------------------------------------------------------------
 
-// A text that begins behind inIndent columns, in lines that do not reach beyond the terminal.
+// A text that begins after inIndent columns, in lines that do not reach beyond the terminal.
 void WriteText(std::string_view inText, std::size_t inIndent, Style inStyle)
 {
 	const std::size_t room

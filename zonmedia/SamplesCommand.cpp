@@ -135,8 +135,8 @@ std::int32_t ReadSampleRate(const std::string& inText)
 {
 	std::int32_t rate = 0;
 	const char* const end = inText.data() + inText.size();
-	const auto [behind, error] = std::from_chars(inText.data(), end, rate);
-	const bool endsRate = behind == end || IsSameName({behind, end}, "Hz");
+	const auto [rest, error] = std::from_chars(inText.data(), end, rate);
+	const bool endsRate = rest == end || IsSameName({rest, end}, "Hz");
 	if (error != std::errc() || !endsRate || rate <= 0)
 		throw UsageProblem(Quoted(inText) + " is no sample rate; expected 1 to "
 			+ std::to_string(std::numeric_limits<std::int32_t>::max()) + " samples a second, such as 48000");

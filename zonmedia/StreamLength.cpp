@@ -33,7 +33,7 @@ using Times = std::vector<std::int64_t>;
 
 std::string_view Tag(const AVStream& inStream, const char* inName)
 {
-	// Matroska's tags of a stream may have its language behind: "DURATION-eng".
+	// Matroska's tags of a stream may end with its language: "DURATION-eng".
 	const AVDictionaryEntry* entry = av_dict_get(inStream.metadata, inName, nullptr, 0);
 	if (entry == nullptr)
 		entry = av_dict_get(inStream.metadata, (std::string(inName) + "-").c_str(), nullptr, AV_DICT_IGNORE_SUFFIX);

@@ -41,7 +41,7 @@ std::vector<std::string_view> LinesOf(std::string_view inText)
 	return lines;
 }
 
-// Where what is behind a name begins: behind the first two blanks in a row after it; the indent when there is no name.
+// Where what follows a name begins: after the first two blanks in a row after it; the indent when there is no name.
 std::size_t HangingIndent(std::string_view inLine)
 {
 	const std::size_t name = std::min(inLine.find_first_not_of(' '), inLine.size());
@@ -49,7 +49,7 @@ std::size_t HangingIndent(std::string_view inLine)
 	return gap == std::string_view::npos ? name : std::min(inLine.find_first_not_of(' ', gap), inLine.size());
 }
 
-// The line with its text broken, all lines but the first behind inIndent blanks and all but the last before inMark.
+// The line with its text broken, all lines but the first after inIndent blanks and all but the last before inMark.
 std::string Broken(
 	std::string_view inLine, std::size_t inStart, std::size_t inIndent, std::string_view inMark, std::size_t inWidth)
 {

@@ -22,7 +22,7 @@ std::size_t LineWidth();
 /// The columns that UTF-8 text takes on a terminal.
 std::size_t Width(std::string_view inText);
 
-/// inText with blanks behind it, or before it, up to inWidth columns.
+/// inText with blanks after it, or before it, up to inWidth columns.
 std::string Padded(std::string_view inText, std::size_t inWidth, bool inToTheRight = false);
 
 std::string WithoutBlanksAtTheEnd(std::string_view inLine);

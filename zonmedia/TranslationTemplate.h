@@ -10,7 +10,7 @@
 namespace zonmedia
 {
 
-/// A key: a path and, behind its first "=", the English text.
+/// A key: a path and, after its first "=", the English text.
 struct TextKey
 {
 	std::string_view mPath;

@@ -3,7 +3,7 @@
 #   usage: make-manual.sh PROGRAM VERSION >zonmedia.1
 set -euo pipefail
 program=$1 version=$2
-export COLUMNS=73   # of 80, as pages are shown, behind the indent of a section
+export COLUMNS=73   # of 80, as pages are shown, after the indent of a section
 
 # Lines as they stand, with what the page's language would read as its own.
 verbatim() { sed -e 's/\\/\\e/g' -e 's/-/\\-/g' -e "s/^[.']/\\\\\&&/"; }

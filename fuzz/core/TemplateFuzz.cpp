@@ -142,7 +142,7 @@ void CheckKeys(FuzzInput& ioInput)
 	Require(anything.starts_with("$$$/known/") || anything == "$$$/a=b"
 			|| localizer.Lookup(anything)
 				== utility::UTF8to16(equals == std::string::npos ? "" : anything.substr(equals + 1)),
-		"the English text stands behind the first mark");
+		"the English text stands after the first mark");
 }
 
 }   // namespace

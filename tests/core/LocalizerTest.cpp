@@ -24,7 +24,7 @@ std::string Look(std::string_view inKey)
 	return UTF16to8(Localizer::Get().Lookup(inKey));
 }
 
-TEST(Localizer, GivesTheTextBehindTheFirstEqualsSign)
+TEST(Localizer, GivesTheTextAfterTheFirstEqualsSign)
 {
 	EXPECT_EQ(Look("$$$/area/Name=English text"), "English text");
 	EXPECT_EQ(Look("$$$/area/Name=a=b"), "a=b");

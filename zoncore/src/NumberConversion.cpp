@@ -84,7 +84,7 @@ std::size_t DecimalLength(UTF16StringView inText)
 	return exponent.TakeDigits(0).mCount == 0 ? length : length + 1 + exponent.GetPosition();
 }
 
-// The number behind an exponent's mark; one that is far beyond every text's length and every double is cut short.
+// The number after an exponent's mark; one that is far beyond every text's length and every double is cut short.
 std::int64_t ReadExponent(UTF16StringView inText)
 {
 	constexpr std::uint64_t kMost = 4'000'000'000'000'000'000;

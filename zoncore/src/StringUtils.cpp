@@ -97,7 +97,7 @@ Decoded DecodeUTF16(UTF16StringView inText)
 	return {isSurrogate ? kReplacementCharacter : first, 1};
 }
 
-// Writes a code point at outText and returns the place behind it: one code unit or two.
+// Writes a code point at outText and returns the place after it: one code unit or two.
 UTF16Char* WriteUTF16(UTF16Char* outText, char32_t inCodePoint)
 {
 	if (inCodePoint < kFirstSupplementary)

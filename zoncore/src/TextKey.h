@@ -11,7 +11,7 @@ constexpr std::string_view KeyPath(std::string_view inKey)
 	return inKey.substr(0, inKey.find('='));
 }
 
-/// The text that a key carries behind its first "="; empty when it has none.
+/// The text that a key carries after its first "="; empty when it has none.
 constexpr std::string_view EnglishText(std::string_view inKey)
 {
 	const auto mark = inKey.find('=');
