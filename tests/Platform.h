@@ -16,7 +16,7 @@
 	#include <process.h>
 #elif !defined(__wasi__)
 	#include <csignal>
-	#include <locale.h>
+	#include <locale.h>   // NOLINT(modernize-deprecated-headers): POSIX' own locales are in no other
 	#include <sys/wait.h>
 	#include <unistd.h>
 	#if defined(__APPLE__)

@@ -106,8 +106,8 @@ TEST(MessageCatalogue, IsReadFromFilesOfUpTo64MB)
 	EXPECT_FALSE(catalogue.Load("no/such/catalogue.mo", error));
 	EXPECT_EQ(error, "no/such/catalogue.mo: cannot be opened: No such file or directory");
 	EXPECT_FALSE(catalogue.Load(".", error));
-	EXPECT_THAT(error,   // a folder; Windows does not even open one
-		testing::AnyOf(testing::StartsWith(".: cannot be read: "), ".: cannot be opened: Permission denied"));
+	EXPECT_TRUE(error.starts_with(".: cannot be read: ") || error == ".: cannot be opened: Permission denied")
+		<< error;   // a folder; Windows does not even open one
 
 	const std::string path = testing::TempDir() + "MessageCatalogueTest-" + zontest::ProcessId();
 	std::ofstream(path, std::ios::binary) << MakeCatalogue(kGerman);
