@@ -4,6 +4,7 @@
 #include "zonmediatypes/Descriptions.h"
 
 #include <optional>
+#include <utility>
 
 namespace zonmedia
 {
@@ -90,6 +91,21 @@ std::optional<AudioChannelLayout> DescribedLayout(std::string_view inText)
 	return described;
 }
 
+// The layout whose description inText is by naming each channel: "8 Channels (L R C LFE Rls Rrs Ls Rs)". The catalogue need
+// not have it.
+std::optional<AudioChannelLayout> SpelledLayout(std::string_view inText)
+{
+	const std::size_t first = inText.rfind('(');
+	if (first == std::string_view::npos || !inText.ends_with(')'))
+		return std::nullopt;
+	const std::vector<std::string_view> words = WordsOf(inText.substr(first + 1, inText.size() - first - 2));
+	if (!std::ranges::all_of(words, IsAbbreviation))
+		return std::nullopt;
+	AudioChannelLayout layout = ReadAbbreviations(words);
+	const bool isIts = IsSameName(inText, zoncore::utility::UTF16to8(AudioChannelLayoutDescription(layout)));
+	return isIts ? std::optional(std::move(layout)) : std::nullopt;
+}
+
 }   // namespace
 
 std::span<const Named<AudioChannelLayout>> LayoutNames()
@@ -102,6 +118,8 @@ AudioChannelLayout ReadLayout(std::string_view inText)
 {
 	if (const auto described = DescribedLayout(inText))
 		return *described;
+	if (const auto spelled = SpelledLayout(inText))
+		return *spelled;
 	if (inText.find(',') != std::string_view::npos)
 		return ReadAbbreviations(ItemsOf(inText, ','));
 	// Marks within words belong to names of layouts: "L_ R_C" is L R C, not L Rc.

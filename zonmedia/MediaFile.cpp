@@ -121,7 +121,7 @@ AudioStream ReadAudio(AVFormatContext& ioFile, const AVStream& inStream, PacketR
 	audio.mCodec = avcodec_get_name(parameters.codec_id);
 	audio.mSampleRate = parameters.sample_rate;
 	audio.mLayout = LayoutOf(parameters.ch_layout);
-	audio.mSampleCount = ReadSampleCount(ioFile, inStream, ioPackets);
+	audio.mLength = ReadSoundLength(ioFile, inStream, ioPackets);
 	return audio;
 }
 
@@ -169,6 +169,8 @@ MediaFile ReadMediaFile(const std::string& inPath, const Scan& inScan)
 	media.mStartSample = StartSample(*format);
 	media.mIsStill = IsStill(*format);
 	ReadStreams(*format, inScan, media);
+	if (!media.mVideo && media.mIsStill)
+		throw InputProblem(media.mFormat + " image that is damaged, or whose end is missing");
 	if (!media.mVideo && media.mAudio.empty())
 		throw InputProblem("no video and no audio in this file");
 	return media;

@@ -36,7 +36,7 @@ struct AudioStream
 	std::string mCodec;
 	std::int64_t mSampleRate = 0;
 	zonmediatypes::AudioChannelLayout mLayout;   ///< each channel by its role in the file
-	std::optional<std::int64_t> mSampleCount;
+	SoundLength mLength;
 };
 
 struct MediaFile

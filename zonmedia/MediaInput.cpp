@@ -73,6 +73,13 @@ bool HasAtom(AVIOContext& ioFile, std::uint32_t inKind)
 	return false;
 }
 
+std::string ErrorText(int inError)
+{
+	std::array<char, AV_ERROR_MAX_STRING_SIZE> text{};
+	av_strerror(inError, text.data(), text.size());
+	return text.data();
+}
+
 // What is known of a file that looks like media and could not be opened as such.
 std::string Damage(const std::string& inName)
 {
@@ -82,6 +89,8 @@ std::string Damage(const std::string& inName)
 	const std::unique_ptr<AVIOContext, CloseIO> file(opened);
 	const AVInputFormat* format = nullptr;
 	const int score = av_probe_input_buffer2(file.get(), &format, nullptr, nullptr, 0, 0);
+	if (score == AVERROR(EIO))
+		return ErrorText(score);
 	if (score <= AVPROBE_SCORE_RETRY || format == nullptr)
 		return kNoMedia;
 	const std::string name = format->long_name;
@@ -92,11 +101,9 @@ std::string Damage(const std::string& inName)
 
 std::string Reason(int inError, const std::string& inName)
 {
-	if (inError == AVERROR_INVALIDDATA || inError == AVERROR_EOF)
-		return Damage(inName);
-	std::array<char, AV_ERROR_MAX_STRING_SIZE> text{};
-	av_strerror(inError, text.data(), text.size());
-	return text.data();
+	// Some readers take an end that comes too early for a failure to read.
+	const bool canBeDamage = inError == AVERROR_INVALIDDATA || inError == AVERROR_EOF || inError == AVERROR(EIO);
+	return canBeDamage ? Damage(inName) : ErrorText(inError);
 }
 
 Format OpenFile(const std::string& inPath)

@@ -90,7 +90,7 @@ std::optional<Span> SoundSpan(const MediaFile& inFile)
 		return std::nullopt;
 	TickTime start;
 	start.AddFrames(inFile.mStartSample.value_or(0), rate->mRate);
-	const std::optional<std::int64_t> count = inFile.mAudio.front().mSampleCount;
+	const std::optional<std::int64_t> count = inFile.mAudio.front().mLength.mSampleCount;
 	return Span{"Last sample", "Samples", &kText_LastSample, *rate, {kTimeDisplay_AudioSamples}, start, count,
 		SteadyDuration(count, rate->mRate)};
 }
@@ -104,12 +104,13 @@ void AddRate(Record& ioSheet, const Rate& inRate)
 	ioSheet.Add("Rate is rounded", {"", inRate.mIsRounded});
 }
 
-// Where the frames differ in length, the one that is last does not begin a frame before the end.
+// Where the frames differ in length, the one that is last does not begin a frame before the end; where there are none, none
+// is the last.
 void AddEnd(Record& ioSheet, const Span& inSpan, std::optional<TickTime> inEnd)
 {
 	const FrameRate rate = inSpan.mRate.mRate;
 	const Value end = inEnd ? TimeValue(*inEnd, rate, inSpan.mForm) : Unknown();
-	if (!inEnd || !inSpan.mIsSteady)
+	if (!inEnd || !inSpan.mIsSteady || inEnd == inSpan.mStart)
 	{
 		ioSheet.Add("End", end);
 		ioSheet.Add(inSpan.mLastName, {"", nullptr});
@@ -159,13 +160,13 @@ Value VariationValue(const std::optional<RateVariation>& inVariation)
 	return {text, Json{{"average", average}, {"lowest", json(lowest)}, {"highest", json(highest)}}};
 }
 
-Value MissingValue(const VideoLength& inLength)
+// inText is what says it of frames or samples.
+Value MissingValue(const OwnText& inText, std::optional<std::int64_t> inPresent, std::optional<std::int64_t> inStated)
 {
-	if (!inLength.mStatedCount || !inLength.mFrameCount)
+	if (!inPresent || !inStated)
 		return {"", nullptr};
-	const std::string text
-		= Say(kText_Truncated, {std::to_string(*inLength.mFrameCount), std::to_string(*inLength.mStatedCount)});
-	return {text, Json{{"present", *inLength.mFrameCount}, {"stated", *inLength.mStatedCount}}};
+	const std::string text = Say(inText, {std::to_string(*inPresent), std::to_string(*inStated)});
+	return {text, Json{{"present", *inPresent}, {"stated", *inStated}}};
 }
 
 // ---- Picture ---------------------------------------------------------------------------------------------------------
@@ -257,7 +258,7 @@ void AddVideo(Record& ioSheet, const MediaFile& inFile)
 	ioSheet.Add("Variable frame rate", VariationValue(length.mVariation));
 	if (picture)
 		AddTimes(ioSheet, *picture);
-	ioSheet.Add("Missing", MissingValue(length));
+	ioSheet.Add("Missing", MissingValue(kText_Truncated, length.mFrameCount, length.mStatedCount));
 	AddPicture(ioSheet, *inFile.mVideo, false);
 	ioSheet.Add("Audio", AudioDescription(inFile));
 	if (picture && picture->mDuration)
@@ -278,6 +279,8 @@ void AddSound(Record& ioSheet, const MediaFile& inFile)
 	}
 	if (sound && sound->mDuration)
 		ioSheet.Add("Milliseconds", TimeText(*sound->mDuration, sound->mRate.mRate, {kTimeDisplay_Milliseconds}));
+	const SoundLength length = inFile.mAudio.front().mLength;
+	ioSheet.Add("Missing", MissingValue(kText_TruncatedSound, length.mSampleCount, length.mStatedCount));
 	ioSheet.Add("Audio", AudioDescription(inFile));
 	ioSheet.mItems.emplace_back(AudioTable(inFile));
 }

@@ -64,17 +64,20 @@ std::optional<std::int64_t> Rescaled(std::int64_t inDuration, AVRational inTimeB
 	return count > 0 ? std::optional(count) : std::nullopt;
 }
 
-// The stream's own length, or that of the file when it has no other stream; in units of 1/inRate seconds.
+// The stream's own length, or that of the file when it has no other stream; in units of 1/inRate seconds. Matroska keeps it
+// as a tag, and its reader gives a stream without packets, as in a file that is cut off early, the length of the file.
 std::optional<std::int64_t> StatedDuration(const AVFormatContext& inFile, const AVStream& inStream, AVRational inRate)
 {
 	if (IsGuessed(inFile))
 		return std::nullopt;
-	if (inStream.duration != AV_NOPTS_VALUE)
-		return Rescaled(inStream.duration, inStream.time_base, inRate);
 	std::int64_t microseconds = 0;
 	const std::string tag(Tag(inStream, "DURATION"));
-	if (!tag.empty() && av_parse_time(&microseconds, tag.c_str(), 1) >= 0)
+	const bool isFirst = std::string_view(inFile.iformat->name).starts_with("matroska");
+	const bool hasOther = inStream.duration != AV_NOPTS_VALUE && !isFirst;
+	if (!tag.empty() && !hasOther && av_parse_time(&microseconds, tag.c_str(), 1) >= 0)
 		return Rescaled(microseconds, av_get_time_base_q(), inRate);
+	if (inStream.duration != AV_NOPTS_VALUE)
+		return Rescaled(inStream.duration, inStream.time_base, inRate);
 	return inFile.nb_streams == 1 ? Rescaled(inFile.duration, av_get_time_base_q(), inRate) : std::nullopt;
 }
 
@@ -166,6 +169,16 @@ VideoLength CountedLength(
 	return length;
 }
 
+// Whether all packets of a sound end before inStated samples, by more than what the last ones may leave open.
+bool EndsBefore(std::int64_t inStated, const AVStream& inStream, AVRational inRate, const PacketTotals& inTotals)
+{
+	constexpr std::int64_t kOpen = 2;   // packets
+	if (inTotals.mCount == 0 || !inTotals.mStart)
+		return false;
+	const std::int64_t reach = ReachOf(inStream, inRate, inTotals);
+	return inStated - reach > reach / inTotals.mCount * kOpen;
+}
+
 // The length of a stream by its last packets, in its own units; nothing where they cannot be reached without all others.
 std::optional<std::int64_t> LengthToLastPacket(
 	const AVFormatContext& inFile, const AVStream& inStream, PacketReader& ioPackets)
@@ -250,18 +263,22 @@ VideoLength ReadVideoLength(
 	return CountedLength(ioFile, ioStream, inRate, ReadFromBeginning(ioStream, ioPackets));
 }
 
-std::optional<std::int64_t> ReadSampleCount(AVFormatContext& ioFile, const AVStream& inStream, PacketReader& ioPackets)
+SoundLength ReadSoundLength(AVFormatContext& ioFile, const AVStream& inStream, PacketReader& ioPackets)
 {
 	const AVRational rate{inStream.codecpar->sample_rate, 1};
 	if (const auto stated = StatedDuration(ioFile, inStream, rate))
-		return stated;
+	{
+		const bool isCut = ioPackets.IsAllRead() && EndsBefore(*stated, inStream, rate, ioPackets.TotalsOf(inStream));
+		return isCut ? SoundLength{ReachOf(inStream, rate, ioPackets.TotalsOf(inStream)), stated}
+					 : SoundLength{stated, std::nullopt};
+	}
 	if (!ioPackets.IsAllRead())
 	{
 		if (const auto length = LengthToLastPacket(ioFile, inStream, ioPackets))
-			return Rescaled(*length, inStream.time_base, rate);
+			return {Rescaled(*length, inStream.time_base, rate), std::nullopt};
 		ReadFromBeginning(inStream, ioPackets);
 	}
-	return Rescaled(ioPackets.TotalsOf(inStream).mDuration, inStream.time_base, rate);
+	return {Rescaled(ioPackets.TotalsOf(inStream).mDuration, inStream.time_base, rate), std::nullopt};
 }
 
 }   // namespace zonmedia

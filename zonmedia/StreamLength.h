@@ -32,6 +32,12 @@ struct VideoLength
 	std::optional<zonmediatypes::TickTime> mDuration;   ///< as the timestamps have it, for rates that vary
 };
 
+struct SoundLength
+{
+	std::optional<std::int64_t> mSampleCount;
+	std::optional<std::int64_t> mStatedCount;   ///< what the file says, when its end is missing
+};
+
 /// Whether all packets are to be read, and who is told how far that has come.
 struct Scan
 {
@@ -45,7 +51,8 @@ struct Scan
 VideoLength ReadVideoLength(
 	AVFormatContext& ioFile, AVStream& ioStream, AVRational inRate, PacketReader& ioPackets, const Scan& inScan);
 
-/// The samples of a sound stream; what its packets show where the file does not say.
-std::optional<std::int64_t> ReadSampleCount(AVFormatContext& ioFile, const AVStream& inStream, PacketReader& ioPackets);
+/// The length of a sound stream: what its packets show where the file does not say, or where all of them were read and end
+/// before the length that it states.
+SoundLength ReadSoundLength(AVFormatContext& ioFile, const AVStream& inStream, PacketReader& ioPackets);
 
 }   // namespace zonmedia

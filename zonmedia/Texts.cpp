@@ -32,6 +32,7 @@ constexpr auto sTexts = std::to_array<const OwnText*>({
 	&kText_Average,
 	&kText_AverageAndRange,
 	&kText_Truncated,
+	&kText_TruncatedSound,
 	&kText_FromTo,
 	&kText_Untaken,
 	&kText_ChannelCounts,

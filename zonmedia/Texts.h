@@ -41,6 +41,7 @@ inline constexpr OwnText kText_NoCounterpart{"$$$/zonmedia/Value/NoCounterpart=n
 inline constexpr OwnText kText_Average{"$$$/zonmedia/Value/Average=@0 on average", "A frame rate that varies. @0: a rate."};
 inline constexpr OwnText kText_AverageAndRange{"$$$/zonmedia/Value/AverageAndRange=@0 on average, @1 to @2", "A frame rate that varies. @0, @1, @2: rates."};
 inline constexpr OwnText kText_Truncated{"$$$/zonmedia/Value/Truncated=truncated: @0 of @1 frames are there", "What is missing of a file. @0, @1: numbers."};
+inline constexpr OwnText kText_TruncatedSound{"$$$/zonmedia/Value/TruncatedSound=truncated: @0 of @1 samples are there", "What is missing of a file. @0, @1: numbers."};
 inline constexpr OwnText kText_FromTo{"$$$/zonmedia/Value/FromTo=@0 to @1", "The headline of a conversion. @0, @1: what from and to."};
 inline constexpr OwnText kText_Untaken{"$$$/zonmedia/Audio/Untaken=No channel takes @0", "@0: abbreviations of channels."};
 inline constexpr OwnText kText_ChannelCounts{"$$$/zonmedia/Audio/ChannelCounts=the layouts have @0 and @1 channels", "Why channels cannot be reordered. @0, @1: numbers."};

@@ -135,6 +135,8 @@ TEST(Zonmedia, PrintsOneDocument)
 				 {{"/description", "5.1 (L, R, C, LFE, Ls, Rs)"}, {"/hasLfe", true}, {"/labels/4/leftRight", "Rs"},
 					 {"/labels/3/frontBack", nullptr}}},
 			 {{"AUDIO", "layout", "L R C  LFE Ls Rs"}, {{"/description", "5.1 (L, R, C, LFE, Ls, Rs)"}}},
+			 {{"audio", "layout", "8 channels (L R C LFE Rls Rrs Ls Rs)"},
+				 {{"/description", "8 Channels (L R C LFE Rls Rrs Ls Rs)"}}},
 			 {{"audio", "matrix", "Broadcast51", "L,C"},
 				 {{"/from", "5.1 (L, R, C, LFE, Ls, Rs)"}, {"/matrix", {{1, 0, 0, 0, 0, 0}, {0, 0, 1, 0, 0, 0}}},
 					 {"/untaken", {"R", "LFE", "Ls", "Rs"}}}},
@@ -427,6 +429,9 @@ TEST(Zonmedia, TellsHowLongVideoIs)
 			 {"large-uneven.mkv", {{"/frames", 62}, {lowest, 25.0 / 15}}, true},
 			 {"cut-raw.avi", {{"/frames", 38}, {"/missing", {{"present", 38}, {"stated", 50}}}}, false},
 			 {"cut-counted.mkv", {{"/missing/stated", 62}}, true},
+			 {"cut-early.mkv", {{"/frames", 0}, {"/lastFrame", nullptr}, {"/missing/stated", 50}}, false},
+			 {"tone.flac", {{"/samples", 72'000}, {"/missing", nullptr}}, true},
+			 {"cut-tone.flac", {{"/missing/stated", 72'000}}, true},
 		 })
 	{
 		SCOPED_TRACE(file);
@@ -463,6 +468,7 @@ TEST(Zonmedia, SaysWhatIsNoMediaOrNoFile)
 			 {"notes.txt", "not a media file"}, {"letters.bin", "not a media file"},
 			 {"empty.mov", "not a media file: it is empty"}, {"empty.h264", "it is empty"},
 			 {"empty.flac", "it is empty"}, {"cut-v210-drop.mov", "QuickTime / MOV without its index (moov)"},
+			 {"cut-early.flac", "raw FLAC whose beginning is damaged"}, {"cut-still.png", "PNG image that is damaged"},
 			 {"pipe", "no regular file"}, {".", "a folder"}})
 		ExpectComplaint(Zonmedia({"sheet", folder + "/" + file}), 1, complaint);
 }

@@ -80,12 +80,18 @@ cut_to() { head -c $(($(wc -c < "$2") * $1 / 100)) "$2" > "cut-$2"; }
 cut_to 75 raw.avi
 cut_to 60 counted.mkv
 cut_to 50 v210-drop.mov   # its index is at its end
+make -i raw.avi -f lavfi -i "$(tones 1 mono 10)" -c:v copy -c:a pcm_s16le early.mkv
+head -c 3000 early.mkv > cut-early.mkv   # before the end of its first frame
+make -f lavfi -i "$(tones 1 mono 1.5)" tone.flac
+cut_to 60 tone.flac
+head -c 30 tone.flac > cut-early.flac
 
 # Stills
 for kind in png jpg tiff dpx bmp; do
 	make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 "still.$kind"
 done
 cp still.png still-%03d.png
+cut_to 60 still.png
 
 # No media
 printf 'Notes about a film.\n' > notes.txt
