@@ -40,6 +40,11 @@ std::string_view Tag(const AVStream& inStream, const char* inName)
 	return entry == nullptr ? std::string_view() : entry->value;
 }
 
+bool IsMatroska(const AVFormatContext& inFile)
+{
+	return std::string_view(inFile.iformat->name).starts_with("matroska");
+}
+
 // A length that was worked out from the file's size and bit rate is none.
 bool IsGuessed(const AVFormatContext& inFile)
 {
@@ -72,13 +77,19 @@ std::optional<std::int64_t> StatedDuration(const AVFormatContext& inFile, const 
 		return std::nullopt;
 	std::int64_t microseconds = 0;
 	const std::string tag(Tag(inStream, "DURATION"));
-	const bool isFirst = std::string_view(inFile.iformat->name).starts_with("matroska");
-	const bool hasOther = inStream.duration != AV_NOPTS_VALUE && !isFirst;
+	const bool hasOther = inStream.duration != AV_NOPTS_VALUE && !IsMatroska(inFile);
 	if (!tag.empty() && !hasOther && av_parse_time(&microseconds, tag.c_str(), 1) >= 0)
 		return Rescaled(microseconds, av_get_time_base_q(), inRate);
 	if (inStream.duration != AV_NOPTS_VALUE)
 		return Rescaled(inStream.duration, inStream.time_base, inRate);
 	return inFile.nb_streams == 1 ? Rescaled(inFile.duration, av_get_time_base_q(), inRate) : std::nullopt;
+}
+
+// Matroska's tag may count from the beginning of the file rather than of the stream.
+bool HasClearDuration(const AVFormatContext& inFile, const AVStream& inStream)
+{
+	const bool startsLate = inStream.start_time != AV_NOPTS_VALUE && inStream.start_time > 0;
+	return !startsLate || !IsMatroska(inFile);
 }
 
 // ---- What the packets show -------------------------------------------------------------------------------------------
@@ -247,7 +258,8 @@ VideoLength ReadVideoLength(
 	}
 	// A duration that was taken from the last timestamps may lack a frame.
 	const bool endsAtLastTime = ioFile.duration_estimation_method == AVFMT_DURATION_FROM_PTS;
-	auto frames = endsAtLastTime ? std::nullopt : StatedDuration(ioFile, ioStream, inRate);
+	const bool isClear = !endsAtLastTime && HasClearDuration(ioFile, ioStream);
+	auto frames = isClear ? StatedDuration(ioFile, ioStream, inRate) : std::nullopt;
 	if (!frames)
 	{
 		if (const auto length = LengthToLastPacket(ioFile, ioStream, ioPackets))

@@ -417,6 +417,7 @@ TEST(Zonmedia, TellsHowLongVideoIs)
 	for (const auto& [file, facts, isScan] : std::initializer_list<std::tuple<std::string, Facts, bool>>{
 			 {"short-picture.mkv", twoSeconds, false},         // beside ten seconds of sound
 			 {"large-short-picture.mkv", twoSeconds, false},   // not read, but stated
+			 {"large-late-picture.mkv", twoSeconds, false},    // begins at five seconds
 			 {"short-picture.ts", twoSeconds, false},
 			 {"short.mpg", twoSeconds, false},
 			 {"edited.mp4", {{"/frames", 35}}, false},

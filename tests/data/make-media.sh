@@ -62,6 +62,7 @@ make -f lavfi -i "$(tones 1 mono 0.01)" -c:a pcm_s24le -write_bext 1 -metadata t
 # Lengths: two seconds of picture beside more sound; a clip whose frames are 1/25 s and then 15/25 s apart
 short="$(plain 64x48 25),trim=duration=2"
 make -f lavfi -i "$short" -f lavfi -i "$(tones 1 mono 10)" -c:v mpeg4 -c:a pcm_s16le short-picture.mkv
+make -itsoffset 5 -f lavfi -i "$short" -f lavfi -i "$(tones 1 mono 1)" -c:v mpeg4 -c:a pcm_s16le late-picture.mkv
 make -f lavfi -i "$short" -f lavfi -i "$(tones 1 mono 3)" -c:v mpeg2video -c:a mp2 -muxrate 60M short-picture.ts
 make -f lavfi -i "$short" -c:v mpeg2video short.mpg
 make -f lavfi -i "$short" -c:v libx264 -g 10 short.mp4
@@ -72,7 +73,7 @@ make -i uneven.mp4 -c copy -metadata:s:v NUMBER_OF_FRAMES=62 counted.mkv
 make -f lavfi -i "$short" -c:v rawvideo -pix_fmt uyvy422 raw.avi
 
 # Files that are too large to be read whole, by what players skip; and files whose end is missing
-for file in short-picture.mkv edited.mp4 uneven.mkv uneven.mp4 counted.mkv; do
+for file in short-picture.mkv late-picture.mkv edited.mp4 uneven.mkv uneven.mp4 counted.mkv; do
 	cp "$file" "large-$file"
 	truncate -s 20M "large-$file"
 done
