@@ -141,7 +141,10 @@ std::string FormatName(const AVFormatContext& inFile)
 		return inFile.iformat->long_name;
 	std::string_view name = inFile.iformat->name;
 	if (name == kNumberedPictures && inFile.nb_streams > 0)
-		name = avcodec_get_name(inFile.streams[0]->codecpar->codec_id);
+	{
+		const AVCodecID codec = inFile.streams[0]->codecpar->codec_id;
+		name = codec == AV_CODEC_ID_MJPEG ? "jpeg" : avcodec_get_name(codec);   // one picture is no motion
+	}
 	std::string upper(name.substr(0, name.size() - (name.ends_with(kPicture) ? kPicture.size() : 0)));
 	std::ranges::transform(upper, upper.begin(),
 		[](char inChar) { return inChar >= 'a' && inChar <= 'z' ? static_cast<char>(inChar - 'a' + 'A') : inChar; });

@@ -456,8 +456,9 @@ TEST(Zonmedia, ShowsStillsWithoutTimes)
 		EXPECT_EQ(sheet["imageSize"]["width"], 48) << sheet;
 		EXPECT_FALSE(sheet.contains("rate") || sheet.contains("duration") || sheet.contains("fields")) << sheet;
 	}
-	ExpectFacts(
-		Document({"sheet", folder + "/still.jpg"}), {{"/files/0/format", "JPEG"}, {"/files/0/storedAs", "yuvj444p"}});
+	for (const std::string name : {"/still.jpg", "/large-still.jpg"})
+		ExpectFacts(
+			Document({"sheet", folder + name}), {{"/files/0/format", "JPEG"}, {"/files/0/storedAs", "yuvj444p"}});
 }
 
 TEST(Zonmedia, SaysWhatIsNoMediaOrNoFile)

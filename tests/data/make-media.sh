@@ -91,6 +91,7 @@ head -c 30 tone.flac > cut-early.flac
 for kind in png jpg tiff dpx bmp; do
 	make -f lavfi -i "$(picture 48x32 25)" -frames:v 1 "still.$kind"
 done
+make -f lavfi -i "$(picture 320x240 25)" -frames:v 1 large-still.jpg   # which is told by its name
 cp still.png still-%03d.png
 cut_to 60 still.png
 
