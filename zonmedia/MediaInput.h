@@ -17,13 +17,13 @@ namespace zonmedia
 {
 
 /// Gives an object of FFmpeg's back by the function that takes the address of its pointer.
-template <auto Free>
+template <auto inFree>
 struct FreeBy
 {
 	template <class T>
 	void operator()(T* inObject) const
 	{
-		Free(&inObject);
+		inFree(&inObject);
 	}
 };
 

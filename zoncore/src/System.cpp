@@ -25,7 +25,7 @@
 	#include <xlocale.h>
 #elif defined(__linux__)
 	#include <fcntl.h>
-	#include <locale.h>
+	#include <locale.h>   // NOLINT(modernize-deprecated-headers): POSIX' own locales are in no other
 	#include <string_view>
 	#include <unistd.h>
 #endif
