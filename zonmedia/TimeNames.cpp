@@ -88,7 +88,7 @@ std::string DisplayName(TimeDisplay inDisplay)
 	const auto row = std::ranges::find(sNamesWithoutRate, inDisplay, &std::pair<TimeDisplay, std::string_view>::first);
 	if (row != sNamesWithoutRate.end())
 		return std::string(row->second);
-	const std::string rate = Text(GetFrameRateForTimeDisplay(inDisplay, kFrameRate_Zero));
+	std::string rate = Text(GetFrameRateForTimeDisplay(inDisplay, kFrameRate_Zero));
 	if (!IsDropFrameApplicableForTimeDisplay(inDisplay))
 		return rate;
 	return rate + (IsTimeDisplayDropFrame(inDisplay) ? "df" : "ndf");
